@@ -1,0 +1,65 @@
+#include "board/fill.h"
+
+#include "board/grid.h"
+#include "shell/arithmetic.h"
+#include "shell/game.h"
+
+namespace kr {
+
+void MarkBorderRing(Game& g)
+{
+    for (int16_t cell = 0; cell < 100; ++cell) {
+        if (!IsBorderRing(cell)) continue;
+        ui::Control& image = *g.ui.Cells[static_cast<size_t>(cell)];
+        image.picture = g.ui.Cells[0]->picture;
+        image.enabled = false;
+        g.Board[static_cast<size_t>(cell)] = BORDER;
+    }
+}
+
+void ShowCell(Game& g, int16_t cell)
+{
+    const size_t c = static_cast<size_t>(cell);
+    g.ui.Cells[c]->picture = ui::Palette(g.GreenFlag[c] ? kGreenBulletPicture : g.Board[c]);
+}
+
+void StartBoardFill(Game& g)
+{
+    for (int16_t cell = 11; cell <= 88; ++cell)
+        if (IsPlayable(cell)) g.ui.Cells[static_cast<size_t>(cell)]->picture = ui::Palette(kNoPicture);
+    g.FillCounter = 99;
+    g.timers[1].SetEnabled(true);
+}
+
+void GenerateCell(Game& g, int16_t cell)
+{
+    const size_t c = static_cast<size_t>(cell);
+    auto at = [&](size_t i) { return g.Board[i]; };
+    for (;;) {
+        const float r = g.random.Draw();
+        const int16_t n = Round16(r * 100.0f, "GenerateCell");
+        const bool green = n == 100;
+        const int16_t kind = green ? kBrownBullet : static_cast<int16_t>(n % kGemKinds);
+        g.GreenFlag[c] = green;
+        g.Board[c] = kind;
+        const bool rowRun = at(c + 1) == kind && at(c + 2) == kind;
+        // Row 8's c + 20 lies past the grid; c + 10 is the border there, so the pair can only
+        // match when c + 10 holds the kind.
+        const bool columnRun = at(c + 10) == kind && at(c + 20) == kind;
+        if (!rowRun && !columnRun) break;
+    }
+    ShowCell(g, cell);
+}
+
+void FillTick(Game& g)
+{
+    while (IsBorderRing(g.FillCounter)) --g.FillCounter;
+    GenerateCell(g, g.FillCounter);
+    --g.FillCounter;
+    if (g.FillCounter != 10) return;
+    g.timers[1].SetEnabled(false);
+    if (g.BombPresent) g.timers[6].SetEnabled(true);
+    g.InputReady = true;
+}
+
+}  // namespace kr

@@ -1,0 +1,90 @@
+#pragma once
+#include <array>
+#include <cstdint>
+#include <filesystem>
+#include <string>
+
+#include "shell/random.h"
+#include "shell/screen.h"
+#include "ui/form.h"
+#include "ui/host.h"
+#include "ui/timers.h"
+
+namespace kr {
+
+// The host services the game needs besides its window and timers.
+struct Host {
+    ui::MessageBoxes& messages;
+    ui::SoundChannels& sound;
+};
+
+// The one game object: every piece of state the rules name, the window's controls, its timers and the one
+// random generator. Procedures live with their subsystem and work on this state.
+class Game {
+public:
+    explicit Game(Host host, std::filesystem::path progressFile = "config.cfg");
+    Game(const Game&) = delete;
+    Game& operator=(const Game&) = delete;
+
+    ui::Form form;
+    ui::TimerBank timers;
+    Screen ui;
+    Random random;
+    Host host;
+    std::filesystem::path progressFile;
+    // Set by "Wyjście": the host ends the program at once.
+    bool quitRequested = false;
+
+    // Board
+    std::array<int16_t, 100> Board{};
+    std::array<bool, 100> GreenFlag{};
+    int16_t FillCounter = 0;
+    bool InputReady = false;
+    int16_t SelectedCell = 0;
+    int16_t SwapFrom = 0;
+    int16_t SwapTo = 0;
+    bool SwapUnmatched = false;
+    bool TeleportPending = false;
+    bool BlastPending = false;
+
+    // Hero (attributes in their storage order)
+    int16_t Strength = 0;
+    int16_t Intelligence = 0;
+    int16_t Dexterity = 0;
+    int16_t Endurance = 0;
+    int16_t Accuracy = 0;
+    int16_t Health = 0;
+    int16_t MaxHealth = 0;
+    std::array<int16_t, 6> Resources{};
+    // Entry = resource row x 7 + skill index.
+    std::array<int16_t, 35> SkillCost{};
+    int16_t DeadlyBulletsTurns = 0;
+    int16_t ImmobilisedTurns = 0;
+    bool EnemyAttackToggle = false;
+
+    // Goals of the stage
+    bool BombPresent = false;
+    bool BombRequired = false;
+    int16_t BombWork = 0;
+    int16_t BombTicks = 0;
+    bool EnemyPresent = false;
+    bool EnemyRequired = false;
+    int16_t EnemyHealth = 0;
+    int16_t EnemyAttack = 0;
+    int16_t EnemyHitChance = 0;
+    bool TerminalPresent = false;
+    bool TerminalRequired = false;
+    int16_t TerminalWork = 0;
+
+    // Shell
+    int16_t UnlockedMissions = 0;
+    int16_t SoundOn = 0;     // 1 on, anything else off
+    int16_t TutorialOn = 0;  // 1 on, anything else off
+    int16_t TutorialPage = 0;
+    std::array<std::string, 15> TutorialTexts;  // pages 1..14
+    int16_t ChosenMission = 0;
+    int16_t MissionStage = 0;
+    std::string BriefingText;
+};
+
+}  // namespace kr

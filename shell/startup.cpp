@@ -1,0 +1,51 @@
+#include "shell/startup.h"
+
+#include "board/fill.h"
+#include "hero/skills.h"
+#include "shell/game.h"
+#include "shell/progress.h"
+#include "shell/sound.h"
+#include "shell/texts.h"
+#include "shell/tutorial.h"
+
+namespace kr {
+
+void StartUp(Game& g, uint32_t seed)
+{
+    g.random.Seed(seed);
+
+    for (size_t page = 1; page < kTutorialTexts.size(); ++page) g.TutorialTexts[page] = kTutorialTexts[page];
+    ShowHint(g, DrawFirstHint(g));
+
+    OpenSoundChannels(g);
+    FillSkillCost(g);
+
+    if (!LoadProgress(g)) g.host.messages.ShowOk(kMissingProgressMessage);
+
+    g.ui.MainMenuScreen->left = 2280;
+    g.ui.MainMenuScreen->top = 960;
+    g.ui.BriefingScreen->left = 1560;
+    g.ui.BriefingScreen->top = 1560;
+
+    g.Resources.fill(0);
+    g.InputReady = false;
+    g.SelectedCell = -1;
+    // Cells are drawn flat by the host: no 3-D edge to remove.
+
+    for (ui::Control* plus : g.ui.PlusLabels) plus->top -= 30;
+    for (ui::Control* pip : g.ui.AttributePips) {
+        pip->left += 30;
+        pip->top += 10;
+        pip->width = 195;
+        pip->height = 195;
+    }
+    for (size_t s = 1; s < g.ui.SkillIcons.size(); ++s) g.ui.SkillIcons[s]->top += 40;
+
+    for (ui::Control* icon : g.ui.ResourceIcons) icon->visible = false;
+    MarkBorderRing(g);
+
+    g.ui.MenuLayer->left = 0;
+    g.ui.MenuLayer->top = 0;
+}
+
+}  // namespace kr
