@@ -1,6 +1,7 @@
 #include "board/fill.h"
 
 #include "board/grid.h"
+#include "board/resolve.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
 
@@ -58,8 +59,11 @@ void FillTick(Game& g)
     --g.FillCounter;
     if (g.FillCounter != 10) return;
     g.timers[1].SetEnabled(false);
-    if (g.BombPresent) g.timers[6].SetEnabled(true);
-    g.InputReady = true;
+    // A fill that ends under the stage-done pause or the failure must neither start the bomb clock
+    // nor hand the board back to the player.
+    const bool ending = g.timers[7].Enabled() || g.timers[9].Enabled();
+    if (g.BombPresent && !ending) g.timers[6].SetEnabled(true);
+    if (NothingRunning(g)) g.InputReady = true;
 }
 
 }  // namespace kr

@@ -1,6 +1,11 @@
 #include "shell/events.h"
 
 #include "board/fill.h"
+#include "board/moves.h"
+#include "board/resolve.h"
+#include "board/swap.h"
+#include "combat/effects.h"
+#include "combat/enemy.h"
 #include "combat/outcome.h"
 #include "hero/levelup.h"
 #include "shell/briefing.h"
@@ -46,12 +51,26 @@ void ConnectMenus(Game& g)
     g.form.onKeyDown = [&g](int key) { KeyDown(g, key); };
 }
 
+void ConnectBoard(Game& g)
+{
+    for (size_t cell = 0; cell < g.ui.Cells.size(); ++cell)
+        g.ui.Cells[cell]->onMouseDown = [&g, cell] { CellPressed(g, static_cast<int16_t>(cell)); };
+}
+
 void ConnectTimers(Game& g)
 {
     OnTick(g, 1, FillTick);
+    OnTick(g, 2, SwapTick);
+    OnTick(g, 3, BlastTick);
+    OnTick(g, 4, FallTick);
     OnTick(g, 5, TypewriterTick);
+    OnTick(g, 6, BombClockTick);
     OnTick(g, 7, StageDoneTick);
+    OnTick(g, 8, NoMovesTick);
     OnTick(g, 9, FailureTick);
+    OnTick(g, 10, DamageRiseTick);
+    OnTick(g, 11, EnemyAttackTick);
+    OnTick(g, 12, HitMarkerTick);
     OnTick(g, 16, HintTimerTick);
 }
 
@@ -60,6 +79,7 @@ void ConnectTimers(Game& g)
 void ConnectHandlers(Game& g)
 {
     ConnectMenus(g);
+    ConnectBoard(g);
     ConnectTimers(g);
 }
 

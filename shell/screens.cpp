@@ -39,6 +39,12 @@ void ReturnToMenu(Game& g)
     g.timers[15].SetEnabled(false);
     g.ui.BulletTimeBar->visible = false;
     g.timers[14].SetEnabled(false);
+    // The stage-done pause, the failure and the enemy's attack belong to the mission being left:
+    // left running they would carry on under the menu.
+    for (int timer : {7, 9, 11}) g.timers[timer].SetEnabled(false);
+    g.ui.StageDoneLabel->visible = false;
+    g.ui.MissionFailedLabel->visible = false;
+    g.form.pointer = ui::CursorPicture(ui::NormalCursor);
 }
 
 void PlayClicked(Game& g)

@@ -3,6 +3,11 @@
 #include <map>
 
 #include "board/fill.h"
+#include "board/moves.h"
+#include "board/resolve.h"
+#include "board/swap.h"
+#include "combat/effects.h"
+#include "combat/enemy.h"
 #include "combat/outcome.h"
 #include "combat/stage.h"
 #include "hero/levelup.h"
@@ -70,6 +75,21 @@ const std::map<std::string, Procedure, std::less<>>& Procedures()
         {"EnableMissionButtons", Action(EnableMissionButtons)},
         {"ShowHint", Action1(ShowHint)},
         {"PlaceTutorialPanel", Action(PlaceTutorialPanel)},
+        {"sprawdz", Test(sprawdz)},
+        {"ResolveBoard", Action(ResolveBoard)},
+        {"TurnEnd", Action(TurnEnd)},
+        {"RenewBoard", Action(RenewBoard)},
+        {"StartSwap", {2, [](Game& g, const Args& a) -> std::optional<std::string> {
+                           StartSwap(g, a[0], a[1]);
+                           return std::nullopt;
+                       }}},
+        {"ShootEnemy", {2, [](Game& g, const Args& a) -> std::optional<std::string> {
+                            ShootEnemy(g, a[0], a[1]);
+                            return std::nullopt;
+                        }}},
+        {"DoEngineering", Action1Ref(DoEngineering)},
+        {"HealHero", Action1Ref(HealHero)},
+        {"StartEnemyAttack", Action(StartEnemyAttack)},
         {"MaxHealthFor", {2, [](Game&, const Args& a) -> std::optional<std::string> {
                               return std::to_string(MaxHealthFor(a[0], a[1]));
                           }}},
