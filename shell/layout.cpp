@@ -324,8 +324,8 @@ void BuildMainAndMissionMenus(Builder& b, Screen& s)
     s.PlayButton = &b.Button(s.MainMenuScreen, "Command1", 360, 720, 3375, 855, "Gra", kButtonGrey, big);
     s.OptionsButton = &b.Button(s.MainMenuScreen, "Command2", 360, 1800, 3375, 855, "Opcje", kButtonGrey, big);
     s.ExitButton = &b.Button(s.MainMenuScreen, "Command3", 360, 3000, 3375, 855, "Wyjście", kButtonGrey, big);
-    b.Label(s.MainMenuScreen, "Label8(0)", 360, 4440, 1335, 255, "Kruszarka v.1.0.", kYellow, Sans());
-    b.Label(s.MainMenuScreen, "Label8(1)", 2520, 4440, 1335, 255, kContactLine, kYellow, Sans());
+    b.Label(s.MainMenuScreen, "Label8(0)", 360, 4440, 1335, 255, "Kruszarka v.1.0.", kYellow, Sans()).wordWrap = false;
+    b.Label(s.MainMenuScreen, "Label8(1)", 2520, 4440, 1335, 255, kContactLine, kYellow, Sans()).wordWrap = false;
 
     s.MissionMenuScreen = &b.Panel(s.MenuLayer, "Frame9", 2520, 600, 3615, 5655);
     s.MissionMenuScreen->visible = false;

@@ -3,7 +3,7 @@
 
 namespace kr {
 
-inline constexpr const char* kContactLine = "kontakt: zespół Kruszarki";
+inline constexpr const char* kContactLine = "ekipa Kruszarki";
 
 inline constexpr const char* kMissingProgressMessage = "Nie moge znalezc pliku konfiguracyjnego!";
 

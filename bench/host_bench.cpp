@@ -1,0 +1,200 @@
+// kruszarka-bench: what the SDL host costs a player. Prints start-up to the first presented frame, CPU over an
+// idle spell on the main menu with the real loop, the time to draw one full frame at 1x and 2x, and peak memory.
+//
+//   kruszarka-bench [--idle-seconds N] [--frames N]
+//
+// With no DISPLAY it runs on SDL's offscreen driver, which has no way to sleep in SDL_WaitEventTimeout and polls
+// every millisecond instead: run it under X (Xvfb will do) for the idle figure a player sees.
+#define SDL_MAIN_HANDLED
+#include <sys/resource.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <chrono>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "shell/game.h"
+#include "shell/startup.h"
+#include "ui/headless.h"
+#include "ui/sdl/assets.h"
+#include "ui/sdl/frame_signature.h"
+#include "ui/sdl/game_window.h"
+#include "ui/sdl/handles.h"
+#include "ui/sdl/mixer_sound.h"
+#include "ui/sdl/screenshot.h"
+
+namespace {
+
+using namespace kr;
+using Clock = std::chrono::steady_clock;
+
+double MillisecondsSince(Clock::time_point start)
+{
+    return std::chrono::duration<double, std::milli>(Clock::now() - start).count();
+}
+
+double CpuMilliseconds()
+{
+    rusage usage{};
+    getrusage(RUSAGE_SELF, &usage);
+    const auto ms = [](timeval t) { return static_cast<double>(t.tv_sec) * 1000.0 + static_cast<double>(t.tv_usec) / 1000.0; };
+    return ms(usage.ru_utime) + ms(usage.ru_stime);
+}
+
+double PeakMegabytes()
+{
+    rusage usage{};
+    getrusage(RUSAGE_SELF, &usage);
+    return static_cast<double>(usage.ru_maxrss) / 1024.0;
+}
+
+struct Options {
+    double idleSeconds = 10;
+    int frames = 200;
+};
+
+Options Parse(int argc, char** argv)
+{
+    Options options;
+    for (int i = 1; i + 1 < argc; i += 2) {
+        if (std::strcmp(argv[i], "--idle-seconds") == 0) options.idleSeconds = std::atof(argv[i + 1]);
+        else if (std::strcmp(argv[i], "--frames") == 0) options.frames = std::max(1, std::atoi(argv[i + 1]));
+        else {
+            std::fprintf(stderr, "usage: kruszarka-bench [--idle-seconds N] [--frames N]\n");
+            std::exit(2);
+        }
+    }
+    return options;
+}
+
+// A game on a scripted host with a progress file of its own, so no box waits for an answer.
+struct BenchGame {
+    explicit BenchGame(ui::SoundChannels& channels)
+        : folder(std::filesystem::temp_directory_path() / ("kruszarka-bench-" + std::to_string(::getpid()))),
+          game((std::filesystem::create_directories(folder), Host{messages, channels}), folder / "config.cfg")
+    {
+    }
+    ~BenchGame()
+    {
+        std::error_code ignored;
+        std::filesystem::remove_all(folder, ignored);
+    }
+
+    void Click(const std::string& caption)
+    {
+        const ui::Control* control = game.form.FindByCaption(caption);
+        if (!control) throw std::runtime_error("kruszarka-bench: no button " + caption);
+        const ui::Rect r = game.form.Bounds(*control);
+        game.form.MouseDown(r.left + r.width / 2, r.top + r.height / 2);
+        game.form.MouseUp(r.left + r.width / 2, r.top + r.height / 2);
+    }
+
+    ui::ScriptedMessages messages;
+    std::filesystem::path folder;
+    Game game;
+};
+
+Uint32 PushQuit(Uint32, void*)
+{
+    SDL_Event quit{};
+    quit.type = SDL_QUIT;
+    SDL_PushEvent(&quit);
+    return 0;
+}
+
+void StartUpAndIdle(const Options& options)
+{
+    const Clock::time_point start = Clock::now();
+    const sdl::Subsystem video(SDL_INIT_VIDEO | SDL_INIT_TIMER);
+    const sdl::Assets assets = sdl::Assets::BesideExecutable();
+    sdl::MixerSound sound(assets);
+    BenchGame bench(sound);
+    sdl::GameWindow window(bench.game, assets, sdl::ChooseScale());
+    StartUp(bench.game, 7);
+    window.Show();
+    window.Redraw();
+    const double startUp = MillisecondsSince(start);
+    sound.Start();
+    const double soundReady = MillisecondsSince(start);
+
+    std::printf("video driver                 %s, window scale %dx, sound %s\n", SDL_GetCurrentVideoDriver(),
+                window.Scale(), sound.HasDevice() ? SDL_GetCurrentAudioDriver() : "none");
+    std::printf("start-up to first frame      %.1f ms (in process: SDL, game, start-up, window, first present)\n",
+                startUp);
+    std::printf("sound ready                  %.1f ms after start (device opened after the first frame)\n",
+                soundReady);
+
+    const uint64_t frames = window.FramesPresented();
+    const double cpuBefore = CpuMilliseconds();
+    const Clock::time_point idleStart = Clock::now();
+    SDL_AddTimer(static_cast<Uint32>(options.idleSeconds * 1000), PushQuit, nullptr);
+    window.Run();
+    const double wall = MillisecondsSince(idleStart);
+    const double cpu = CpuMilliseconds() - cpuBefore;
+    std::printf("idle on the main menu        %.1f ms CPU over %.1f s (%.3f %%), %llu frames drawn\n", cpu,
+                wall / 1000.0, 100.0 * cpu / wall, static_cast<unsigned long long>(window.FramesPresented() - frames));
+}
+
+void FrameTimes(const ui::Form& form, const char* scene, int scale, int frames)
+{
+    const sdl::Assets assets = sdl::Assets::BesideExecutable();
+    const Clock::time_point coldStart = Clock::now();
+    sdl::ScreenshotCamera camera(assets, scale);
+    camera.Capture(form);
+    const double cold = MillisecondsSince(coldStart);
+
+    std::vector<double> times;
+    for (int i = 0; i < frames; ++i) {
+        const Clock::time_point t = Clock::now();
+        camera.Capture(form);
+        times.push_back(MillisecondsSince(t));
+    }
+    std::sort(times.begin(), times.end());
+    const Clock::time_point signatureStart = Clock::now();
+    uint64_t sink = 0;
+    for (int i = 0; i < frames; ++i) sink += sdl::FrameSignature(form);
+    const double signature = MillisecondsSince(signatureStart) * 1000.0 / frames;
+    std::printf("frame %-12s %dx         median %.3f ms, worst %.3f ms; first %.1f ms (rasterising); "
+                "signature %.1f us%s\n",
+                scene, scale, times[times.size() / 2], times.back(), cold, signature, sink == 1 ? " " : "");
+}
+
+void RenderTimes(const Options& options)
+{
+    ui::RecordedSound silent;
+    BenchGame menu(silent);
+    StartUp(menu.game, 7);
+    BenchGame board(silent);
+    StartUp(board.game, 7);
+    board.Click("Gra");
+    board.Click("Misja 1");
+    board.Click("Rozpocznij misję ->");
+    board.game.timers.Advance(3000);
+    for (int scale : {1, 2}) {
+        FrameTimes(menu.game.form, "main menu", scale, options.frames);
+        FrameTimes(board.game.form, "game board", scale, options.frames);
+    }
+}
+
+}  // namespace
+
+int main(int argc, char** argv)
+{
+    SDL_SetMainReady();
+    const Options options = Parse(argc, argv);
+    if (!std::getenv("DISPLAY") && !std::getenv("SDL_VIDEODRIVER")) setenv("SDL_VIDEODRIVER", "offscreen", 1);
+    try {
+        StartUpAndIdle(options);
+        RenderTimes(options);
+    } catch (const std::exception& error) {
+        std::fprintf(stderr, "kruszarka-bench: %s\n", error.what());
+        return 1;
+    }
+    std::printf("peak memory                  %.1f MB (ru_maxrss)\n", PeakMegabytes());
+    return 0;
+}

@@ -1,0 +1,157 @@
+#include "ui/sdl/game_window.h"
+
+#include <algorithm>
+#include <cmath>
+#include <cstdlib>
+#include <stdexcept>
+
+#include "ui/sdl/frame_signature.h"
+#include "ui/sdl/input.h"
+#include "ui/sdl/pictures.h"
+
+namespace kr::sdl {
+namespace {
+
+constexpr int kWidth = 576;
+constexpr int kHeight = 447;
+// Room for the title bar and frame a window manager adds.
+constexpr int kDecoration = 64;
+// The most game time one wake-up may run. Beyond it (a modal box, a suspended laptop) the game resumes
+// where it stopped instead of replaying every missed tick of its animations in one burst.
+constexpr double kLongestCatchUp = 250;
+
+}  // namespace
+
+int ChooseScale()
+{
+    if (const char* forced = SDL_getenv("KRUSZARKA_SCALE")) {
+        const int scale = std::atoi(forced);
+        if (scale == 1 || scale == 2) return scale;
+    }
+    SDL_Rect usable{};
+    if (SDL_GetDisplayUsableBounds(0, &usable) != 0) return 1;
+    return 2 * kWidth <= usable.w && 2 * kHeight + kDecoration <= usable.h ? 2 : 1;
+}
+
+GameWindow::GameWindow(Game& game, const Assets& assets, int scale)
+    : game_(game), scale_(scale), cursors_(assets, scale), title_(game.form.caption)
+{
+    // Without this the software renderer sits on an OpenGL texture: five times the memory, slower start.
+    SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
+    window_.reset(SDL_CreateWindow(title_.c_str(), SDL_WINDOWPOS_CENTERED, SDL_WINDOWPOS_CENTERED, kWidth * scale,
+                                   kHeight * scale, SDL_WINDOW_HIDDEN));
+    if (!window_) throw std::runtime_error(std::string("GameWindow: ") + SDL_GetError());
+    renderer_.reset(SDL_CreateRenderer(window_.get(), -1, SDL_RENDERER_SOFTWARE));
+    if (!renderer_) throw std::runtime_error(std::string("GameWindow: ") + SDL_GetError());
+    SDL_RenderSetLogicalSize(renderer_.get(), kWidth, kHeight);
+    SDL_RenderSetIntegerScale(renderer_.get(), SDL_TRUE);
+    if (SurfacePtr icon = RasterisePicture(assets, game.form.icon, scale)) SDL_SetWindowIcon(window_.get(), icon.get());
+    form_ = std::make_unique<FormRenderer>(renderer_.get(), assets, scale);
+    SDL_StopTextInput();
+}
+
+GameWindow::~GameWindow() = default;
+
+void GameWindow::Show()
+{
+    SDL_ShowWindow(window_.get());
+    shownSignature_.reset();
+}
+
+GameWindow::Clock GameWindow::RealClock()
+{
+    return [] {
+        static const double frequency = static_cast<double>(SDL_GetPerformanceFrequency());
+        return static_cast<double>(SDL_GetPerformanceCounter()) * 1000.0 / frequency;
+    };
+}
+
+double GameWindow::GameTime(double clockMs)
+{
+    const double now = static_cast<double>(game_.timers.Now());
+    if (!offset_) offset_ = now - clockMs;
+    const double behind = clockMs + *offset_ - now;
+    if (behind > kLongestCatchUp) *offset_ -= behind - kLongestCatchUp;
+    return clockMs + *offset_;
+}
+
+void GameWindow::Run(const Clock& clock)
+{
+    offset_.reset();
+    GameTime(clock());
+    Redraw();
+    while (!game_.quitRequested) {
+        int timeout = -1;
+        if (const std::optional<int64_t> due = game_.timers.NextDue()) {
+            // Rounded up: waking a fraction early would find nothing due and wait again.
+            const double wait = static_cast<double>(*due) - GameTime(clock());
+            timeout = wait <= 0 ? 0 : static_cast<int>(std::min(std::ceil(wait), 86'400'000.0));
+        }
+        SDL_Event event;
+        if (SDL_WaitEventTimeout(&event, timeout)) {
+            do {
+                if (!Handle(event)) return;
+            } while (SDL_PollEvent(&event));
+        }
+        Tick(clock());
+        if (game_.quitRequested) return;
+        Redraw();
+    }
+}
+
+void GameWindow::Tick(double clockMs)
+{
+    game_.timers.AdvanceTo(static_cast<int64_t>(std::floor(GameTime(clockMs))));
+}
+
+void GameWindow::Mouse(int x, int y, void (ui::Form::*deliver)(float, float))
+{
+    (game_.form.*deliver)(PixelToTwips(x), PixelToTwips(y));
+}
+
+bool GameWindow::Handle(const SDL_Event& event)
+{
+    switch (event.type) {
+    case SDL_QUIT:
+        return false;
+    case SDL_MOUSEBUTTONDOWN:
+        if (event.button.button == SDL_BUTTON_LEFT) Mouse(event.button.x, event.button.y, &ui::Form::MouseDown);
+        break;
+    case SDL_MOUSEBUTTONUP:
+        if (event.button.button == SDL_BUTTON_LEFT) Mouse(event.button.x, event.button.y, &ui::Form::MouseUp);
+        break;
+    case SDL_MOUSEMOTION:
+        Mouse(event.motion.x, event.motion.y, &ui::Form::MouseMove);
+        break;
+    case SDL_KEYDOWN:
+        if (const std::optional<int> code = GameKeyCode(event.key.keysym.sym)) game_.form.KeyDown(*code);
+        break;
+    case SDL_WINDOWEVENT:
+        // The window's pixels were lost or resized: the next Redraw must draw even an unchanged frame.
+        if (event.window.event == SDL_WINDOWEVENT_EXPOSED || event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED ||
+            event.window.event == SDL_WINDOWEVENT_RESTORED)
+            shownSignature_.reset();
+        break;
+    default:
+        break;
+    }
+    return !game_.quitRequested;
+}
+
+bool GameWindow::Redraw()
+{
+    cursors_.Show(game_.form.pointer);
+    if (game_.form.caption != title_) {
+        title_ = game_.form.caption;
+        SDL_SetWindowTitle(window_.get(), title_.c_str());
+    }
+    const uint64_t signature = FrameSignature(game_.form);
+    if (shownSignature_ == signature) return false;
+    form_->Draw(game_.form);
+    SDL_RenderPresent(renderer_.get());
+    shownSignature_ = signature;
+    ++framesPresented_;
+    return true;
+}
+
+}  // namespace kr::sdl

@@ -1,0 +1,69 @@
+#pragma once
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <optional>
+
+#include "shell/game.h"
+#include "ui/sdl/assets.h"
+#include "ui/sdl/cursors.h"
+#include "ui/sdl/form_renderer.h"
+#include "ui/sdl/handles.h"
+
+namespace kr::sdl {
+
+// The largest whole scale, 1 or 2, whose window fits the desktop's usable area. 3x is left out: the
+// monospace advance stops being a whole multiple there.
+int ChooseScale();
+
+// The game's one window: it draws the form, turns SDL's events into the form's input and drives the
+// game's timers from the real clock. Needs SDL's video subsystem.
+class GameWindow {
+public:
+    // Milliseconds on some steady clock; the loop only takes differences.
+    using Clock = std::function<double()>;
+
+    // Created hidden, so a box shown during start-up comes before the window.
+    GameWindow(Game& game, const Assets& assets, int scale);
+    GameWindow(const GameWindow&) = delete;
+    GameWindow& operator=(const GameWindow&) = delete;
+    ~GameWindow();
+
+    void Show();
+    SDL_Window* Handle() const { return window_.get(); }
+    int Scale() const { return scale_; }
+
+    // Waits for events and timer ticks until the game asks to quit or the window is closed.
+    void Run(const Clock& clock = RealClock());
+
+    // The pieces of the loop. Handle returns false when the program must end.
+    bool Handle(const SDL_Event& event);
+    // Runs the timers up to the moment `clockMs` (the loop's clock); the first call ties that clock to the
+    // game's present time.
+    void Tick(double clockMs);
+    // Draws and presents when the frame's signature changed (or the window was exposed); true if it did.
+    bool Redraw();
+
+    uint64_t FramesPresented() const { return framesPresented_; }
+    uint64_t Rasterised() const { return form_->Rasterised(); }
+
+    static Clock RealClock();
+
+private:
+    void Mouse(int x, int y, void (ui::Form::*deliver)(float, float));
+    // The game's time at this clock reading, less what the game did not see.
+    double GameTime(double clockMs);
+
+    Game& game_;
+    int scale_;
+    WindowPtr window_;
+    RendererPtr renderer_;
+    std::unique_ptr<FormRenderer> form_;
+    PointerCursors cursors_;
+    std::optional<uint64_t> shownSignature_;
+    uint64_t framesPresented_ = 0;
+    std::optional<double> offset_;  // game time minus clock time
+    std::string title_;
+};
+
+}  // namespace kr::sdl

@@ -1,0 +1,145 @@
+#include <gtest/gtest.h>
+
+#include "shell/game.h"
+#include "ui/sdl/game_window.h"
+#include "ui/sdl/tests/offscreen.h"
+
+namespace kr::sdl {
+namespace {
+
+using testing::HeadlessGame;
+using testing::OffscreenVideo;
+using testing::SourceAssets;
+
+SDL_Event MouseButton(Uint32 type, SDL_Point at)
+{
+    SDL_Event event{};
+    event.type = type;
+    event.button.button = SDL_BUTTON_LEFT;
+    event.button.x = at.x;
+    event.button.y = at.y;
+    return event;
+}
+
+SDL_Event Key(SDL_Keycode key)
+{
+    SDL_Event event{};
+    event.type = SDL_KEYDOWN;
+    event.key.keysym.sym = key;
+    return event;
+}
+
+// Clicks as SDL reports them: window pixels, a press and a release.
+bool Click(GameWindow& window, const HeadlessGame& session, const std::string& caption)
+{
+    const SDL_Point at = session.Centre(caption);
+    return window.Handle(MouseButton(SDL_MOUSEBUTTONDOWN, at)) && window.Handle(MouseButton(SDL_MOUSEBUTTONUP, at));
+}
+
+class GameWindowTest : public ::testing::Test {
+protected:
+    OffscreenVideo video;
+    HeadlessGame session;
+    Game& game = *session.game;
+    GameWindow window{game, SourceAssets(), 1};
+    double clock = 0;
+
+    // Real time passing in small steps, the way the loop sees it.
+    void Pass(double milliseconds)
+    {
+        for (double end = clock + milliseconds; clock < end;) {
+            clock = std::min(clock + 20, end);
+            window.Tick(clock);
+            window.Redraw();
+        }
+    }
+};
+
+TEST_F(GameWindowTest, PlaysFromTheMenuIntoAMissionAndBack)
+{
+    window.Tick(clock);
+    EXPECT_TRUE(window.Redraw());
+    EXPECT_FALSE(window.Redraw()) << "nothing changed";
+    EXPECT_EQ(window.FramesPresented(), 1u);
+
+    ASSERT_TRUE(Click(window, session, "Gra"));
+    EXPECT_TRUE(game.ui.MissionMenuScreen->visible);
+    EXPECT_FALSE(game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(window.Redraw());
+
+    // A press with the right button is no click.
+    const SDL_Point mission = session.Centre("Misja 1");
+    SDL_Event right = MouseButton(SDL_MOUSEBUTTONDOWN, mission);
+    right.button.button = SDL_BUTTON_RIGHT;
+    window.Handle(right);
+    right.type = SDL_MOUSEBUTTONUP;
+    window.Handle(right);
+    EXPECT_TRUE(game.ui.MissionMenuScreen->visible);
+
+    ASSERT_TRUE(Click(window, session, "Misja 1"));
+    EXPECT_TRUE(game.ui.BriefingScreen->visible);
+    ASSERT_TRUE(Click(window, session, "Rozpocznij misję ->"));
+    EXPECT_FALSE(game.ui.MenuLayer->visible);
+
+    const uint64_t framesBefore = window.FramesPresented();
+    Pass(3000);
+    EXPECT_GE(game.timers.Now(), 3000);
+    for (int row = 1; row <= 8; ++row)
+        for (int column = 1; column <= 8; ++column) {
+            const ui::PictureRef gem = game.ui.Cells[static_cast<size_t>(row * 10 + column)]->picture;
+            EXPECT_EQ(gem.set, ui::PictureSet::Palette) << row << column;
+            EXPECT_NE(gem.index, 10) << "cell " << row << column << " is still empty";
+        }
+    EXPECT_GT(window.FramesPresented(), framesBefore + 10) << "the fill is animated";
+
+    // Keys arrive as the game's codes: Escape asks, N declines, T leaves.
+    window.Handle(Key(SDLK_ESCAPE));
+    EXPECT_TRUE(game.ui.ReturnPrompt->visible);
+    window.Handle(Key(SDLK_n));
+    EXPECT_FALSE(game.ui.ReturnPrompt->visible);
+    window.Handle(Key(SDLK_ESCAPE));
+    window.Handle(Key(SDLK_t));
+    EXPECT_TRUE(game.ui.MenuLayer->visible);
+    EXPECT_TRUE(game.ui.MainMenuScreen->visible);
+
+    EXPECT_FALSE(Click(window, session, "Wyjście")) << "the game asked to quit";
+    EXPECT_TRUE(game.quitRequested);
+}
+
+// A stall (a modal box, a suspended machine) resumes the game where it stopped instead of replaying it.
+TEST_F(GameWindowTest, StallIsNotReplayed)
+{
+    window.Tick(clock);
+    ASSERT_TRUE(Click(window, session, "Gra"));
+    ASSERT_TRUE(Click(window, session, "Misja 1"));
+    ASSERT_TRUE(Click(window, session, "Rozpocznij misję ->"));
+    const int64_t before = game.timers.Now();
+    const uint64_t ticksBefore = game.timers.TicksRun();
+    clock += 60'000;
+    window.Tick(clock);
+    EXPECT_LE(game.timers.Now() - before, 250);
+    EXPECT_LT(game.timers.TicksRun() - ticksBefore, 50u);
+    Pass(100);
+    EXPECT_EQ(game.timers.Now() - before, 350) << "real time runs on from the stall";
+}
+
+// The real loop on the real clock ends on the window's close and on the game's own request.
+TEST_F(GameWindowTest, LoopEndsOnCloseAndOnExit)
+{
+    SDL_Event quit{};
+    quit.type = SDL_QUIT;
+    SDL_PushEvent(&quit);
+    window.Run();
+    EXPECT_FALSE(game.quitRequested);
+    EXPECT_EQ(window.FramesPresented(), 1u);
+
+    const SDL_Point exit = session.Centre("Wyjście");
+    SDL_Event down = MouseButton(SDL_MOUSEBUTTONDOWN, exit), up = MouseButton(SDL_MOUSEBUTTONUP, exit);
+    SDL_PushEvent(&down);
+    SDL_PushEvent(&up);
+    window.Run();
+    EXPECT_TRUE(game.quitRequested);
+}
+
+}  // namespace
+}  // namespace kr::sdl
