@@ -4,6 +4,7 @@
 #include "board/resolve.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 
 namespace kr {
 
@@ -29,7 +30,7 @@ void StartBoardFill(Game& g)
     for (int16_t cell = 11; cell <= 88; ++cell)
         if (IsPlayable(cell)) g.ui.Cells[static_cast<size_t>(cell)]->picture = ui::Palette(kNoPicture);
     g.FillCounter = 99;
-    g.timers[1].SetEnabled(true);
+    g.timers[kFillTimer].SetEnabled(true);
 }
 
 void GenerateCell(Game& g, int16_t cell)
@@ -58,11 +59,11 @@ void FillTick(Game& g)
     GenerateCell(g, g.FillCounter);
     --g.FillCounter;
     if (g.FillCounter != 10) return;
-    g.timers[1].SetEnabled(false);
+    g.timers[kFillTimer].SetEnabled(false);
     // A fill that ends under the stage-done pause or the failure must neither start the bomb clock
     // nor hand the board back to the player.
-    const bool ending = g.timers[7].Enabled() || g.timers[9].Enabled();
-    if (g.BombPresent && !ending) g.timers[6].SetEnabled(true);
+    const bool ending = g.timers[kStageDonePause].Enabled() || g.timers[kFailureTimer].Enabled();
+    if (g.BombPresent && !ending) g.timers[kBombClock].SetEnabled(true);
     if (NothingRunning(g)) g.InputReady = true;
 }
 

@@ -2,11 +2,10 @@
 
 #include "board/fill.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 
 namespace kr {
 namespace {
-
-constexpr int kNoMovesTimer = 8;
 
 struct Direction {
     int step;         // where the icon moves

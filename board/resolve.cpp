@@ -10,13 +10,12 @@
 #include "hero/panel.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/sound.h"
 
 namespace kr {
 namespace {
 
-constexpr int kBlastTimer = 3;
-constexpr int kFallTimer = 4;
 constexpr int kFirstBlastPicture = 11;
 
 // Counts the cells equal to `first` from it on by `step`, up to 7 more; the greens include the first cell.
@@ -56,7 +55,7 @@ std::vector<Run> FindRuns(const BoardCells& board, const std::array<bool, 100>& 
 
 bool NothingRunning(const Game& g)
 {
-    for (int timer : {1, 2, 3, 4, 7, 9, 11})
+    for (int timer : {kFillTimer, kSwapTimer, kBlastTimer, kFallTimer, kStageDonePause, kFailureTimer, kAttackTimer})
         if (g.timers[timer].Enabled()) return false;
     return true;
 }

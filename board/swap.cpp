@@ -8,12 +8,10 @@
 #include "board/resolve.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 
 namespace kr {
 namespace {
-
-constexpr int kSwapTimer = 2;
-constexpr int kTargetBlinkTimer = 13;
 
 // Pictures both cells show at swap steps 8..2: a sparkle shrinking to nothing and growing back.
 int SparkleFor(int step)

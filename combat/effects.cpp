@@ -6,13 +6,11 @@
 #include "combat/stage.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/sound.h"
 
 namespace kr {
 namespace {
-
-constexpr int kRiseTimer = 10;
-constexpr int kMarkerTimer = 12;
 
 void Sound(Game& g, void (*play)(Game&))
 {

@@ -8,17 +8,11 @@
 #include "hero/panel.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/sound.h"
 
 namespace kr {
 namespace {
-
-constexpr int kBombClock = 6;
-constexpr int kRiseTimer = 10;
-constexpr int kAttackTimer = 11;
-constexpr int kBulletTimeDuration = 14;
-constexpr int kBulletTimeBar = 15;
-constexpr int kNormalBombInterval = 100;
 
 bool BulletTimeRunning(const Game& g) { return g.timers[kBulletTimeDuration].Enabled(); }
 
@@ -93,7 +87,7 @@ void BombClockTick(Game& g)
     }
     StartFailure(g);
     if (g.SoundOn == 1) PlayBoom(g);
-    for (int timer = 1; timer <= kBombClock; ++timer) g.timers[timer].SetEnabled(false);
+    for (int timer = kFillTimer; timer <= kBombClock; ++timer) g.timers[timer].SetEnabled(false);
     g.timers[kBombClock].SetInterval(kNormalBombInterval);
     g.timers[kBulletTimeBar].SetEnabled(false);
     g.ui.BulletTimeBar->visible = false;

@@ -6,15 +6,13 @@
 #include "hero/levelup.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/sound.h"
 
 namespace kr {
 namespace {
 
-constexpr int kBombClock = 6;
-constexpr int kStageDonePause = 7;
-constexpr int kFailureTimer = 9;
-constexpr int kEnemyAttackTimer = 11;
+// "Zadanie wykonane!" and "Misja nieudana!" each blink ten times, 700 ms apart.
 constexpr int kBlinks = 10;
 
 // Toggles a blinking label and counts the timer's tag down; true when the count has run out.
@@ -61,7 +59,7 @@ void CheckStageDone(Game& g)
     pause.tag = std::to_string(kBlinks);
     pause.SetEnabled(true);
     g.timers[kBombClock].SetEnabled(false);
-    g.timers[kEnemyAttackTimer].SetEnabled(false);
+    g.timers[kAttackTimer].SetEnabled(false);
     g.form.pointer = ui::CursorPicture(ui::NormalCursor);
     if (g.SoundOn == 1) PlayGoalDone(g);
     g.ui.StageDoneLabel->visible = true;

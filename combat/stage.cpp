@@ -5,6 +5,7 @@
 #include "combat/outcome.h"
 #include "hero/panel.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/sound.h"
 
 namespace kr {
@@ -99,7 +100,7 @@ void SetUpStage(Game& g, const int16_t& mission, const int16_t& stage)
     g.InputReady = false;
     if (g.SoundOn == 1) PlayStart(g);
     // A bomb clock left running by the last stage must not tick into this one's fill.
-    g.timers[6].SetEnabled(false);
+    g.timers[kBombClock].SetEnabled(false);
     StartBoardFill(g);
 }
 

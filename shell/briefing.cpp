@@ -3,13 +3,12 @@
 #include "combat/stage.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/texts.h"
 #include "shell/tutorial.h"
 
 namespace kr {
 namespace {
-
-constexpr int kTypewriterTimer = 5;
 
 // Length in bytes of the UTF-8 character that starts with `lead`.
 size_t CharacterLength(unsigned char lead)

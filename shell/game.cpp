@@ -1,4 +1,5 @@
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 
 #include "shell/events.h"
 
@@ -17,7 +18,7 @@ Game::Game(Host services, std::filesystem::path progress) : host(services), prog
     for (int number = 1; number <= ui::TimerBank::kCount; ++number)
         timers[number].SetInterval(kIntervals[number - 1]);
     // The hint timer runs from the moment the window exists.
-    timers[16].SetEnabled(true);
+    timers[kHintTimer].SetEnabled(true);
     ConnectHandlers(*this);
 }
 

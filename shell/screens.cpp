@@ -2,6 +2,7 @@
 
 #include "shell/briefing.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/progress.h"
 
 namespace kr {
@@ -34,14 +35,14 @@ void ReturnToMenu(Game& g)
     g.ui.ReturnPrompt->visible = false;
     g.ui.MenuLayer->visible = true;
     g.ui.MainMenuScreen->visible = true;
-    for (int timer = 1; timer <= 6; ++timer) g.timers[timer].SetEnabled(false);
-    g.timers[6].SetInterval(100);
-    g.timers[15].SetEnabled(false);
+    for (int timer = kFillTimer; timer <= kBombClock; ++timer) g.timers[timer].SetEnabled(false);
+    g.timers[kBombClock].SetInterval(kNormalBombInterval);
+    g.timers[kBulletTimeBar].SetEnabled(false);
     g.ui.BulletTimeBar->visible = false;
-    g.timers[14].SetEnabled(false);
+    g.timers[kBulletTimeDuration].SetEnabled(false);
     // The stage-done pause, the failure and the enemy's attack belong to the mission being left:
     // left running they would carry on under the menu.
-    for (int timer : {7, 9, 11}) g.timers[timer].SetEnabled(false);
+    for (int timer : {kStageDonePause, kFailureTimer, kAttackTimer}) g.timers[timer].SetEnabled(false);
     g.ui.StageDoneLabel->visible = false;
     g.ui.MissionFailedLabel->visible = false;
     g.form.pointer = ui::CursorPicture(ui::NormalCursor);

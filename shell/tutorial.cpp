@@ -4,11 +4,10 @@
 
 #include "shell/arithmetic.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 
 namespace kr {
 namespace {
-
-constexpr int kHintTimer = 16;
 
 // round(r x n) redrawn while 0 or n: uniform over 1..n-1.
 int16_t DrawPage(Game& g, int n)
