@@ -30,18 +30,6 @@ std::string RunOfThree(char k)
     return std::string{k, k, '3', k} + "2302\n23023023\n30230230\n02302302\n23023023\n30230230\n02302302\n55053023\n";
 }
 
-int64_t AdvanceUntil(Session& s, const std::function<bool()>& done, int limit = 20000)
-{
-    for (int waited = 0; !done(); ++waited) {
-        if (waited >= limit) {
-            ADD_FAILURE() << "waited " << limit << " ms in vain";
-            break;
-        }
-        s.Advance(1);
-    }
-    return s.game.timers.Now();
-}
-
 // One real move that lines up three icons of kind k.
 void PlayRun(Session& s, char kind)
 {
@@ -64,7 +52,7 @@ void WinMission(Session& s, int m, int lastStage)
     ASSERT_TRUE(s.game.InputReady);
     s.Run("set EnemyHitChance 0\nset EnemyHealth 1\nset TerminalWork 1\nset BombWork 1");
     PlayRun(s, s.game.EnemyRequired ? '1' : '4');
-    AdvanceUntil(s, [&] { return s.game.ui.MissionCompleteScreen->visible; });
+    s.AdvanceUntil([&] { return s.game.ui.MissionCompleteScreen->visible; });
 }
 
 std::string Shown(Session& s, const std::string& control) { return s.Print(control + ".Visible"); }
@@ -87,7 +75,7 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     // The door: opened by a real move, then "Zadanie wykonane!" blinks ten times 700 ms apart.
     s.Run("set TerminalWork 1");
     PlayRun(s, '4');
-    const int64_t done = AdvanceUntil(s, [&] { return s.game.ui.StageDoneLabel->visible; });
+    const int64_t done = s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
     EXPECT_EQ(s.Print("Timer7.Tag"), "\"10\"");
     EXPECT_EQ(s.Print("Timer7.Interval"), "700");
     EXPECT_EQ(s.Print("DoneFrame(2).Visible"), "True");
@@ -118,7 +106,7 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     ASSERT_TRUE(s.game.InputReady);
     s.Run("set EnemyHealth 1");
     PlayRun(s, '1');
-    const int64_t beaten = AdvanceUntil(s, [&] { return s.game.ui.StageDoneLabel->visible; });
+    const int64_t beaten = s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
     s.Advance(6999);
     EXPECT_EQ(Shown(s, "MissionCompleteScreen"), "False");
     s.Advance(1);
@@ -239,7 +227,7 @@ TEST(CampaignFailure, ALostMissionChangesNoSavedValue)
     s.SetBoard(RunOfThree('0').replace(0, 4, "0230"));  // swapping 13 and 14 lines nothing up
     s.Press(13);
     s.Press(14);
-    AdvanceUntil(s, [&] { return s.game.ui.MissionMenuScreen->visible; });
+    s.AdvanceUntil([&] { return s.game.ui.MissionMenuScreen->visible; });
     EXPECT_EQ(ReadFile(s.folder().File("config.cfg")), saved);
     EXPECT_FALSE(fs::exists(s.folder().File("config.cfg.tmp")));
     EXPECT_EQ(s.game.UnlockedMissions, 3);
@@ -261,7 +249,7 @@ TEST(CampaignStageEnd, ADoorOpenedOnATurnThatLeavesNoMoveClosesTheStageOnTheNext
         s.SetBoard(nearlyDead);
         s.Press(13);
         s.Press(14);
-        AdvanceUntil(s, [&] { return s.game.ui.NoMovesLabel->visible || s.game.ui.StageDoneLabel->visible; });
+        s.AdvanceUntil([&] { return s.game.ui.NoMovesLabel->visible || s.game.ui.StageDoneLabel->visible; });
         if (!s.game.ui.NoMovesLabel->visible) continue;  // this refill left a move: try another seed
 
         EXPECT_FALSE(s.game.TerminalRequired);
@@ -272,7 +260,7 @@ TEST(CampaignStageEnd, ADoorOpenedOnATurnThatLeavesNoMoveClosesTheStageOnTheNext
         ASSERT_TRUE(s.game.InputReady);
         EXPECT_FALSE(s.game.timers[7].Enabled());
         PlayRun(s, '0');
-        AdvanceUntil(s, [&] { return s.game.ui.StageDoneLabel->visible; });
+        s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
         s.Advance(7000);
         EXPECT_EQ(s.game.MissionStage, 1);
         return;

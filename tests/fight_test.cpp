@@ -81,23 +81,10 @@ void Set(Session& s, std::initializer_list<std::string> assignments)
     for (const std::string& assignment : assignments) ASSERT_EQ(s.Run("set " + assignment), 0) << assignment;
 }
 
-// Advances the clock a millisecond at a time until `done` holds; returns that moment.
-int64_t AdvanceUntil(Session& s, const std::function<bool()>& done, int limit = 20000)
-{
-    for (int waited = 0; !done(); ++waited) {
-        if (waited >= limit) {
-            ADD_FAILURE() << "waited " << limit << " ms in vain";
-            break;
-        }
-        s.Advance(1);
-    }
-    return Now(s);
-}
-
 // Until the board is the player's again: nothing animating, no attack, input released.
 void Settle(Session& s)
 {
-    AdvanceUntil(s, [&] { return s.game.InputReady && NothingRunning(s.game); });
+    s.AdvanceUntil([&] { return s.game.InputReady && NothingRunning(s.game); });
 }
 
 // The channels played since the last call.
@@ -210,7 +197,7 @@ TEST(FightShots, AnOverkillShotFinishesTheEnemyAndItNeverShootsBack)
     EXPECT_EQ(s.Print("EnemyHealthBar.Width"), "1");
     EXPECT_EQ(s.Print("HitMarker.Visible"), "False");
 
-    AdvanceUntil(s, [&] { return s.game.ui.StageDoneLabel->visible; });
+    s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
     EXPECT_FALSE(s.game.timers[11].Enabled()) << "a dead enemy takes no turn";
     EXPECT_EQ(s.game.Health, 30);
     EXPECT_EQ(s.game.DeadlyBulletsTurns, 0);
@@ -273,7 +260,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         Settle(s);
         s.Run("set TerminalWork 1");
         StartRun(s, "444");
-        AdvanceUntil(s, [&] { return s.game.ui.StageDoneLabel->visible; });
+        s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
         EXPECT_EQ(s.game.BombWork, 100);
         EXPECT_TRUE(s.game.BombPresent);
         const int16_t ticks = s.game.BombTicks;
@@ -335,7 +322,7 @@ TEST(FightEnemyTurn, AMandatoryEnemyBlinksFourTimesShootsAtOneSecondAndHandsTheB
     Enter(s, 0, 1);  // the robot: attack 2
     s.Run("set EnemyHitChance 101");
     StartRun(s, "000");
-    const int64_t turnEnd = AdvanceUntil(s, [&] { return s.game.timers[11].Enabled(); });
+    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
     EXPECT_EQ(s.Print("Pointer"), "EnemyTurnCursor");
     EXPECT_FALSE(s.game.InputReady);
 
@@ -371,7 +358,7 @@ TEST(FightEnemyTurn, AMandatoryEnemyBlinksFourTimesShootsAtOneSecondAndHandsTheB
     Settle(s);
     s.Run("set EnemyHitChance 0");
     StartRun(s, "000");
-    AdvanceUntil(s, [&] { return s.game.timers[11].Enabled(); });
+    s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
     s.Advance(999);
     Sounds(s);
     s.Advance(1);
@@ -389,7 +376,7 @@ TEST(FightEnemyTurn, AnOptionalEnemyBlinksWithoutAFrameAndAStageEndCutsItsShotOf
     s.Run("set EnemyHitChance 0");
     EXPECT_EQ(s.Print("RequiredFrame(1).Visible"), "False");
     StartRun(s, "000");
-    const int64_t turnEnd = AdvanceUntil(s, [&] { return s.game.timers[11].Enabled(); });
+    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
     const char* const frame[5] = {"True", "False", "True", "False", "False"};
     for (int tick = 0; tick < 5; ++tick) {
         s.Advance(static_cast<int>(turnEnd + 200 * (tick + 1) - Now(s)));
@@ -406,7 +393,7 @@ TEST(FightEnemyTurn, AnOptionalEnemyBlinksWithoutAFrameAndAStageEndCutsItsShotOf
     Lay(s, RunOfThree("444"));
     Sounds(s);
     Swap(s, 13, 14);
-    AdvanceUntil(s, [&] { return s.game.ui.StageDoneLabel->visible; });
+    s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
     EXPECT_FALSE(s.game.timers[11].Enabled());
     EXPECT_EQ(s.Print("Pointer"), "NormalCursor");
     EXPECT_FALSE(s.game.InputReady);
@@ -518,10 +505,10 @@ TEST(FightBomb, AShotThatKillsAfterTheBombWentOffStartsNoSecondFailure)
     Enter(s, 4, 2);  // "Misja 5", stage 2: an enemy and a bomb
     Set(s, {"EnemyHitChance 101", "Health 1"});
     StartRun(s, "000");
-    const int64_t turnEnd = AdvanceUntil(s, [&] { return s.game.timers[11].Enabled(); });
+    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
     s.Run("set BombTicks 3");
     Sounds(s);
-    const int64_t boom = AdvanceUntil(s, [&] { return s.game.timers[9].Enabled(); });
+    const int64_t boom = s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
     EXPECT_LT(boom, turnEnd + 1000);
     EXPECT_EQ(Sounds(s), (std::vector<int>{8, 9}));
     s.Advance(static_cast<int>(turnEnd + 1000 - Now(s)));
@@ -548,7 +535,7 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         s.Run("set EnemyHitChance 0");
         Lay(s, kDeadBoard, false);
         Swap(s, 11, 12);
-        const int64_t turnEnd = AdvanceUntil(s, [&] { return s.game.timers[11].Enabled(); });
+        const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
         EXPECT_EQ(s.game.Health, 20) << "the swap lined up nothing";
         EXPECT_EQ(s.Print("NoMovesLabel.Visible"), "True");
         s.Advance(1000);
@@ -567,7 +554,7 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         Lay(s, kDeadBoard, false);
         Sounds(s);
         Swap(s, 11, 12);
-        const int64_t turnEnd = AdvanceUntil(s, [&] { return s.game.timers[11].Enabled(); });
+        const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
         EXPECT_EQ(s.game.Health, 1);
         s.Advance(1000);
         EXPECT_EQ(s.game.Health, -1);
@@ -594,7 +581,7 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         Lay(s, kDeadBoard, false);
         Sounds(s);
         Swap(s, 11, 12);
-        const int64_t death = AdvanceUntil(s, [&] { return s.game.timers[9].Enabled(); });
+        const int64_t death = s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
         EXPECT_EQ(s.game.Health, 0);
         EXPECT_FALSE(s.game.timers[6].Enabled());
         EXPECT_EQ(Sounds(s), (std::vector<int>{11, 8}));
@@ -622,7 +609,7 @@ TEST(FightEndings, AHeroWhoDiesHasLostEvenWhenNoMandatoryGoalIsLeft)
     Lay(s, Board({}));
     Sounds(s);
     Swap(s, 11, 12);
-    const int64_t death = AdvanceUntil(s, [&] { return s.game.timers[9].Enabled(); });
+    const int64_t death = s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
     EXPECT_FALSE(s.game.timers[7].Enabled());
     EXPECT_EQ(s.Print("StageDoneLabel.Visible"), "False");
     EXPECT_EQ(Sounds(s), (std::vector<int>{11, 8}));
@@ -658,7 +645,7 @@ TEST(FightEndings, KeyTLeavesDuringTheStagePauseTheFailureOrTheEnemyTurn)
         Enter(s, 0, 0);
         s.Run("set TerminalWork 1");
         StartRun(s, "444");
-        AdvanceUntil(s, [&] { return s.game.ui.StageDoneLabel->visible; });
+        s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
         s.Advance(1000);
         s.Key(84);
         ExpectLeftForGood(s, 0, 30);
@@ -669,7 +656,7 @@ TEST(FightEndings, KeyTLeavesDuringTheStagePauseTheFailureOrTheEnemyTurn)
         s.Run("set Health 1");
         Lay(s, Board({}));  // swapping 11 and 12 lines nothing up
         Swap(s, 11, 12);
-        AdvanceUntil(s, [&] { return s.game.timers[9].Enabled(); });
+        s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
         s.Advance(1000);
         s.Key(84);
         ExpectLeftForGood(s, 0, -12);
@@ -679,7 +666,7 @@ TEST(FightEndings, KeyTLeavesDuringTheStagePauseTheFailureOrTheEnemyTurn)
         Enter(s, 1, 0);
         s.Run("set EnemyHitChance 101");
         StartRun(s, "000");
-        AdvanceUntil(s, [&] { return s.game.timers[11].Enabled(); });
+        s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
         s.Advance(500);
         s.Key(84);
         ExpectLeftForGood(s, 0, 40);

@@ -1,5 +1,7 @@
 #include "tests/session.h"
 
+#include <gtest/gtest.h>
+
 #include <fstream>
 #include <random>
 #include <stdexcept>
@@ -58,6 +60,18 @@ int Session::Run(const std::string& lines)
 void Session::Must(const std::string& line)
 {
     if (Run(line) != 0) throw std::runtime_error("scenario line failed: " + line + "\n" + out_.str());
+}
+
+int64_t Session::AdvanceUntil(const std::function<bool()>& done, int limit)
+{
+    for (int waited = 0; !done(); ++waited) {
+        if (waited >= limit) {
+            ADD_FAILURE() << "waited " << limit << " ms in vain";
+            break;
+        }
+        game.timers.Advance(1);
+    }
+    return game.timers.Now();
 }
 
 void Session::SetBoard(const std::string& rows) { Must("board\n" + rows); }

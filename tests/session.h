@@ -1,5 +1,6 @@
 #pragma once
 #include <filesystem>
+#include <functional>
 #include <sstream>
 #include <string>
 
@@ -42,6 +43,9 @@ public:
     void Press(int cell) { Must("press Image1(" + std::to_string(cell) + ")"); }
     void Key(int code) { Must("key " + std::to_string(code)); }
     void Advance(int ms) { Must("wait " + std::to_string(ms)); }
+    // Advances the clock a millisecond at a time until `done` holds, and returns that moment; a test failure
+    // when it has not held after `limit` ms.
+    int64_t AdvanceUntil(const std::function<bool()>& done, int limit = 20000);
     // Rows 1..8 of the board, "0"-"5" a kind, "g" a green-tipped bullet.
     void SetBoard(const std::string& rows);
     std::string Print(const std::string& name);
