@@ -4,6 +4,6 @@
 set -euo pipefail
 here="$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd)"
 "$here/scripts/install-deps.sh"
-cmake -S "$here" -B "$here/build" -DCMAKE_BUILD_TYPE=Release > /dev/null
+cmake -S "$here" -B "$here/build" > /dev/null
 cmake --build "$here/build" -j"$(nproc)" --target kruszarka
 exec "$here/build/kruszarka"

@@ -115,7 +115,8 @@ bool GameWindow::Handle(const SDL_Event& event)
     case SDL_QUIT:
         return false;
     case SDL_MOUSEBUTTONDOWN:
-        if (event.button.button == SDL_BUTTON_LEFT) Mouse(event.button.x, event.button.y, &ui::Form::MouseDown);
+        // Board cells and skills answer a press of any button; only the left one goes on to a click.
+        Mouse(event.button.x, event.button.y, &ui::Form::MouseDown);
         break;
     case SDL_MOUSEBUTTONUP:
         if (event.button.button == SDL_BUTTON_LEFT) Mouse(event.button.x, event.button.y, &ui::Form::MouseUp);
