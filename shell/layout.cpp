@@ -79,6 +79,7 @@ public:
         Control& c = Label(nullptr, std::move(name), l, t, w, h, std::move(caption), fore, Mono(points, true),
                            Align::Centre);
         c.visible = false;
+        c.mouseThrough = true;
         return c;
     }
 
@@ -155,7 +156,7 @@ void BuildHeroPanel(Builder& b, Screen& s)
     }
     s.HeroShotFrame = &b.Outline(s.HeroPanel, "Shape8", 600, 240, 735, 495, Colour{128, 255, 128}, 2);
     s.HeroShotFrame->visible = false;
-    s.DamageLabel = &b.Label(s.HeroPanel, "Label4", 240, 240, 255, 255, "90", kYellow, Mono(8.25f, true),
+    s.DamageLabel = &b.Label(s.HeroPanel, "Label4", 240, 240, 255, 255, "90", kYellow, Mono(8.25f),
                              Align::Centre);
     s.DamageLabel->wordWrap = false;
     s.DamageLabel->visible = false;

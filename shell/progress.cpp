@@ -1,6 +1,10 @@
 #include "shell/progress.h"
 
+#include <fcntl.h>
+#include <unistd.h>
+
 #include <algorithm>
+#include <cerrno>
 #include <charconv>
 #include <fstream>
 #include <sstream>
@@ -97,24 +101,35 @@ bool LoadProgress(Game& g)
     return complete;
 }
 
+namespace {
+
+// Writes the whole text and forces it to the disk, so that the rename that follows can never expose an
+// empty or partial file, even after a power cut.
+bool WriteDurably(const std::filesystem::path& file, const std::string& text)
+{
+    const int fd = ::open(file.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0644);
+    if (fd < 0) return false;
+    bool written = true;
+    for (size_t done = 0; written && done < text.size();) {
+        const ssize_t n = ::write(fd, text.data() + done, text.size() - done);
+        if (n > 0) done += static_cast<size_t>(n);
+        else written = n < 0 && errno == EINTR;
+    }
+    written = written && ::fsync(fd) == 0;
+    return ::close(fd) == 0 && written;
+}
+
+}  // namespace
+
 void SaveProgress(Game& g)
 {
-    const std::string text = FormatProgress(FromGame(g));
     std::filesystem::path temporary = g.progressFile;
     temporary += ".tmp";
-    {
-        std::ofstream file{temporary, std::ios::binary | std::ios::trunc};
-        if (!file) return;
-        file << text;
-        file.flush();
-        if (!file) {
-            file.close();
-            std::error_code ignored;
-            std::filesystem::remove(temporary, ignored);
-            return;
-        }
-    }
     std::error_code error;
+    if (!WriteDurably(temporary, FormatProgress(FromGame(g)))) {
+        std::filesystem::remove(temporary, error);
+        return;
+    }
     std::filesystem::rename(temporary, g.progressFile, error);
     if (error) std::filesystem::remove(temporary, error);
 }

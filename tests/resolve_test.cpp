@@ -93,9 +93,13 @@ TEST_F(BoardPlay, SelectingDeselectingAndSwappingANeighbour)
 {
     ASSERT_TRUE(s.game.InputReady);
     s.SetBoard(With(kStill, {{34, '5'}, {54, '5'}, {45, '5'}}));
+    // The return question lies over rows 3..6 and lets presses through to the cells.
+    s.Key(27);
+    ASSERT_TRUE(s.game.ui.ReturnPrompt->visible);
     s.Press(45);
     EXPECT_TRUE(s.game.ui.SelectionMarker->visible);
     EXPECT_EQ(s.Print("SelectionMarker.Left"), s.Print("Image1(45).Left"));
+    s.Key(78);
     s.Press(45);
     EXPECT_FALSE(s.game.ui.SelectionMarker->visible);
     EXPECT_EQ(s.game.SelectedCell, -1);

@@ -3,6 +3,7 @@
 #include <map>
 
 #include "board/fill.h"
+#include "board/grid.h"
 #include "board/moves.h"
 #include "board/resolve.h"
 #include "board/swap.h"
@@ -24,12 +25,28 @@ namespace {
 
 using Args = std::vector<int16_t>;
 
+constexpr ArgumentRule kAnyCell{[](int16_t c) { return c >= 0 && c < 100; }, "a cell 0..99"};
+constexpr ArgumentRule kPlayableCell{[](int16_t c) { return IsPlayable(c); }, "a playable cell"};
+constexpr ArgumentRule kMission{[](int16_t m) { return m >= 0 && m <= 9; }, "a mission 0..9"};
+constexpr ArgumentRule kStage{[](int16_t s) { return s >= 0 && s <= 4; }, "a stage 0..4"};
+constexpr ArgumentRule kPage{[](int16_t p) { return p >= 1 && p <= 14; }, "a page 1..14"};
+constexpr ArgumentRule kAttribute{[](int16_t a) { return a >= 0 && a <= 10; }, "an attribute 0..10"};
+constexpr ArgumentRule kAmount{[](int16_t a) { return a >= -1000 && a <= 1000; }, "an amount -1000..1000"};
+constexpr ArgumentRule kGreenTips{[](int16_t n) { return n >= 0 && n <= 8; }, "green tips 0..8"};
+
+Procedure Checked(Procedure procedure, std::vector<ArgumentRule> rules)
+{
+    procedure.rules = std::move(rules);
+    return procedure;
+}
+
 Procedure Action(void (*procedure)(Game&))
 {
     return {0, [procedure](Game& g, const Args&) -> std::optional<std::string> {
                 procedure(g);
                 return std::nullopt;
-            }};
+            },
+            {}};
 }
 
 Procedure Action1(void (*procedure)(Game&, int16_t))
@@ -37,7 +54,8 @@ Procedure Action1(void (*procedure)(Game&, int16_t))
     return {1, [procedure](Game& g, const Args& a) -> std::optional<std::string> {
                 procedure(g, a[0]);
                 return std::nullopt;
-            }};
+            },
+            {}};
 }
 
 Procedure Action1Ref(void (*procedure)(Game&, const int16_t&))
@@ -45,54 +63,62 @@ Procedure Action1Ref(void (*procedure)(Game&, const int16_t&))
     return {1, [procedure](Game& g, const Args& a) -> std::optional<std::string> {
                 procedure(g, a[0]);
                 return std::nullopt;
-            }};
+            },
+            {}};
 }
 
 Procedure Test(bool (*procedure)(Game&))
 {
-    return {0, [procedure](Game& g, const Args&) -> std::optional<std::string> { return FormatBool(procedure(g)); }};
+    return {0, [procedure](Game& g, const Args&) -> std::optional<std::string> { return FormatBool(procedure(g)); },
+            {}};
 }
 
 const std::map<std::string, Procedure, std::less<>>& Procedures()
 {
     static const std::map<std::string, Procedure, std::less<>> procedures{
         {"StartBoardFill", Action(StartBoardFill)},
-        {"GenerateCell", Action1(GenerateCell)},
-        {"ShowCell", Action1(ShowCell)},
+        {"GenerateCell", Checked(Action1(GenerateCell), {kPlayableCell})},
+        {"ShowCell", Checked(Action1(ShowCell), {kAnyCell})},
         {"MarkBorderRing", Action(MarkBorderRing)},
         {"RefreshHeroPanel", Action(RefreshHeroPanel)},
-        {"SetUpStage", {2, [](Game& g, const Args& a) -> std::optional<std::string> {
+        {"SetUpStage", {2,
+                        [](Game& g, const Args& a) -> std::optional<std::string> {
                             SetUpStage(g, a[0], a[1]);
                             return std::nullopt;
-                        }}},
+                        },
+                        {kMission, kStage}}},
         {"CheckStageDone", Action(CheckStageDone)},
         {"StartFailure", Action(StartFailure)},
-        {"ShowMissionComplete", Action1Ref(ShowMissionComplete)},
-        {"PrepareLevelUp", Action1Ref(PrepareLevelUp)},
+        {"ShowMissionComplete", Checked(Action1Ref(ShowMissionComplete), {kMission})},
+        {"PrepareLevelUp", Checked(Action1Ref(PrepareLevelUp), {kMission})},
         {"LoadProgress", Test(LoadProgress)},
         {"SaveProgress", Action(SaveProgress)},
         {"ReturnToMenu", Action(ReturnToMenu)},
         {"EnableMissionButtons", Action(EnableMissionButtons)},
-        {"ShowHint", Action1(ShowHint)},
+        {"ShowHint", Checked(Action1(ShowHint), {kPage})},
         {"PlaceTutorialPanel", Action(PlaceTutorialPanel)},
         {"sprawdz", Test(sprawdz)},
         {"ResolveBoard", Action(ResolveBoard)},
         {"TurnEnd", Action(TurnEnd)},
         {"RenewBoard", Action(RenewBoard)},
-        {"StartSwap", {2, [](Game& g, const Args& a) -> std::optional<std::string> {
+        {"StartSwap", {2,
+                       [](Game& g, const Args& a) -> std::optional<std::string> {
                            StartSwap(g, a[0], a[1]);
                            return std::nullopt;
-                       }}},
+                       },
+                       {kAnyCell, kAnyCell}}},
         {"ShootEnemy", {2, [](Game& g, const Args& a) -> std::optional<std::string> {
                             ShootEnemy(g, a[0], a[1]);
                             return std::nullopt;
-                        }}},
-        {"DoEngineering", Action1Ref(DoEngineering)},
-        {"HealHero", Action1Ref(HealHero)},
+                        }, {kAmount, kGreenTips}}},
+        {"DoEngineering", Checked(Action1Ref(DoEngineering), {kAmount})},
+        {"HealHero", Checked(Action1Ref(HealHero), {kAmount})},
         {"StartEnemyAttack", Action(StartEnemyAttack)},
-        {"MaxHealthFor", {2, [](Game&, const Args& a) -> std::optional<std::string> {
+        {"MaxHealthFor", {2,
+                          [](Game&, const Args& a) -> std::optional<std::string> {
                               return std::to_string(MaxHealthFor(a[0], a[1]));
-                          }}},
+                          },
+                          {kMission, kAttribute}}},
     };
     return procedures;
 }

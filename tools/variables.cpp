@@ -236,9 +236,13 @@ std::optional<std::string> CallProcedure(Game& g, std::string_view name, const s
     if (!procedure) throw ScriptError("unknown procedure: " + std::string(name));
     if (args.size() != procedure->arity) throw ScriptError("wrong number of arguments for " + std::string(name));
     std::vector<int16_t> narrow;
-    for (int a : args) {
+    for (size_t i = 0; i < args.size(); ++i) {
+        const int a = args[i];
         if (a < INT16_MIN || a > INT16_MAX) throw ScriptError("argument out of 16-bit range");
         narrow.push_back(static_cast<int16_t>(a));
+        if (i < procedure->rules.size() && !procedure->rules[i].accepts(narrow.back()))
+            throw ScriptError("argument " + std::to_string(i + 1) + " of " + std::string(name) + " must be " +
+                              procedure->rules[i].expected);
     }
     return procedure->run(g, narrow);
 }

@@ -61,7 +61,10 @@ struct Control {
     std::function<void()> onClick;
     std::function<void()> onMouseMove;
 
-    bool TakesMouse() const { return kind != ControlKind::Shape; }
+    // A notice over the board that presses pass through to the cells beneath.
+    bool mouseThrough = false;
+
+    bool TakesMouse() const { return kind != ControlKind::Shape && !mouseThrough; }
 };
 
 }  // namespace kr::ui
