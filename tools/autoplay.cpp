@@ -52,7 +52,7 @@ MissionResult PlayMission(Game& g, int mission, int64_t limit)
             const auto swap = FirstMatchingSwap(g.Board).value_or(std::pair<int16_t, int16_t>{11, 12});
             ClickAt(g, *g.ui.Cells[static_cast<size_t>(swap.first)]);
             ClickAt(g, *g.ui.Cells[static_cast<size_t>(swap.second)]);
-            // A label over the board (the no-moves notice) can take the presses; then time must pass.
+            // Presses that started no swap (say, a selection left from before) must not spin: let time pass.
             if (!g.InputReady) {
                 ++result.moves;
                 continue;
