@@ -77,6 +77,15 @@ void EnemyAttackTick(Game& g)
     g.form.pointer = ui::CursorPicture(ui::NormalCursor);
 }
 
+void StopMissionClocks(Game& g)
+{
+    for (int timer = kFillTimer; timer <= kBombClock; ++timer) g.timers[timer].SetEnabled(false);
+    g.timers[kBombClock].SetInterval(kNormalBombInterval);
+    g.timers[kBulletTimeBar].SetEnabled(false);
+    g.ui.BulletTimeBar->visible = false;
+    g.timers[kBulletTimeDuration].SetEnabled(false);
+}
+
 void BombClockTick(Game& g)
 {
     g.BombTicks = To16(g.BombTicks - 1, "BombClockTick");
@@ -87,11 +96,7 @@ void BombClockTick(Game& g)
     }
     StartFailure(g);
     if (g.SoundOn == 1) PlayBoom(g);
-    for (int timer = kFillTimer; timer <= kBombClock; ++timer) g.timers[timer].SetEnabled(false);
-    g.timers[kBombClock].SetInterval(kNormalBombInterval);
-    g.timers[kBulletTimeBar].SetEnabled(false);
-    g.ui.BulletTimeBar->visible = false;
-    g.timers[kBulletTimeDuration].SetEnabled(false);
+    StopMissionClocks(g);
 }
 
 }  // namespace kr

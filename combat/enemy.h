@@ -14,6 +14,10 @@ void EnemyTurnGate(Game& g, TurnKind turn);
 void StartEnemyAttack(Game& g);
 void EnemyAttackTick(Game& g);
 
+// Stops the board's animations, the typewriter and the bomb clock (back at its normal pace), and ends
+// Bullet Time: what both an explosion and leaving the mission do.
+void StopMissionClocks(Game& g);
+
 // The bomb countdown; at zero the bomb goes off and the mission is lost.
 void BombClockTick(Game& g);
 

@@ -1,5 +1,6 @@
 #include "shell/screens.h"
 
+#include "combat/enemy.h"
 #include "shell/briefing.h"
 #include "shell/game.h"
 #include "shell/timer_numbers.h"
@@ -35,11 +36,7 @@ void ReturnToMenu(Game& g)
     g.ui.ReturnPrompt->visible = false;
     g.ui.MenuLayer->visible = true;
     g.ui.MainMenuScreen->visible = true;
-    for (int timer = kFillTimer; timer <= kBombClock; ++timer) g.timers[timer].SetEnabled(false);
-    g.timers[kBombClock].SetInterval(kNormalBombInterval);
-    g.timers[kBulletTimeBar].SetEnabled(false);
-    g.ui.BulletTimeBar->visible = false;
-    g.timers[kBulletTimeDuration].SetEnabled(false);
+    StopMissionClocks(g);
     // The stage-done pause, the failure and the enemy's attack belong to the mission being left:
     // left running they would carry on under the menu.
     for (int timer : {kStageDonePause, kFailureTimer, kAttackTimer}) g.timers[timer].SetEnabled(false);
