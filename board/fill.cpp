@@ -1,7 +1,6 @@
 #include "board/fill.h"
 
 #include "board/grid.h"
-#include "board/resolve.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
 #include "shell/timer_numbers.h"
@@ -12,8 +11,8 @@ void MarkBorderRing(Game& g)
 {
     for (int16_t cell = 0; cell < 100; ++cell) {
         if (!IsBorderRing(cell)) continue;
-        ui::Control& image = *g.ui.Cells[static_cast<size_t>(cell)];
-        image.picture = g.ui.Cells[0]->picture;
+        ui::Control& image = *g.screen.Cells[static_cast<size_t>(cell)];
+        image.picture = g.screen.Cells[0]->picture;
         image.enabled = false;
         g.Board[static_cast<size_t>(cell)] = BORDER;
     }
@@ -22,13 +21,13 @@ void MarkBorderRing(Game& g)
 void ShowCell(Game& g, int16_t cell)
 {
     const size_t c = static_cast<size_t>(cell);
-    g.ui.Cells[c]->picture = ui::Palette(g.GreenFlag[c] ? kGreenBulletPicture : g.Board[c]);
+    g.screen.Cells[c]->picture = ui::Palette(g.GreenFlag[c] ? kGreenBulletPicture : g.Board[c]);
 }
 
 void StartBoardFill(Game& g)
 {
     for (int16_t cell = 11; cell <= 88; ++cell)
-        if (IsPlayable(cell)) g.ui.Cells[static_cast<size_t>(cell)]->picture = ui::Palette(kNoPicture);
+        if (IsPlayable(cell)) g.screen.Cells[static_cast<size_t>(cell)]->picture = ui::Palette(kNoPicture);
     g.FillCounter = 99;
     g.timers[kFillTimer].SetEnabled(true);
 }
@@ -64,7 +63,7 @@ void FillTick(Game& g)
     // nor hand the board back to the player.
     const bool ending = g.timers[kStageDonePause].Enabled() || g.timers[kFailureTimer].Enabled();
     if (g.BombPresent && !ending) g.timers[kBombClock].SetEnabled(true);
-    if (NothingRunning(g)) g.InputReady = true;
+    if (NothingRunning(g.timers)) g.InputReady = true;
 }
 
 }  // namespace kr

@@ -44,7 +44,7 @@ bool sprawdz(Game& g) { return HasPossibleMove(g.Board); }
 
 void RenewBoard(Game& g)
 {
-    g.ui.NoMovesLabel->visible = true;
+    g.screen.NoMovesLabel->visible = true;
     g.timers[kNoMovesTimer].SetEnabled(true);
     StartBoardFill(g);
     g.InputReady = false;
@@ -52,7 +52,7 @@ void RenewBoard(Game& g)
 
 void NoMovesTick(Game& g)
 {
-    g.ui.NoMovesLabel->visible = false;
+    g.screen.NoMovesLabel->visible = false;
     g.timers[kNoMovesTimer].SetEnabled(false);
 }
 

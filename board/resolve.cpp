@@ -53,43 +53,36 @@ std::vector<Run> FindRuns(const BoardCells& board, const std::array<bool, 100>& 
     return runs;
 }
 
-bool NothingRunning(const Game& g)
+void ClearCell(Game& g, int16_t cell)
 {
-    for (int timer : {kFillTimer, kSwapTimer, kBlastTimer, kFallTimer, kStageDonePause, kFailureTimer, kAttackTimer})
-        if (g.timers[timer].Enabled()) return false;
-    return true;
+    const size_t c = static_cast<size_t>(cell);
+    g.Board[c] = CLEARED;
+    g.GreenFlag[c] = false;
+    g.screen.Cells[c]->picture = ui::Palette(kFirstBlastPicture);
 }
+
+void StartBlast(Game& g) { StartCountdown(g.timers[kBlastTimer], 8); }
 
 void ResolveBoard(Game& g)
 {
-    BoardCells working = g.Board;
+    // Every run is found before any cell is cleared, so a cell shared by a row and a column counts in both.
     const std::vector<Run> runs = FindRuns(g.Board, g.GreenFlag);
     for (const Run& run : runs) {
         g.SwapUnmatched = false;
         ApplyRunEffects(g, run.kind, run.power, run.greens);
-        for (int n = 0; n <= run.power; ++n) {
-            const size_t cell = static_cast<size_t>(run.first + run.step * n);
-            working[cell] = CLEARED;
-            g.ui.Cells[cell]->picture = ui::Palette(kFirstBlastPicture);
-        }
+        for (int n = 0; n <= run.power; ++n) ClearCell(g, static_cast<int16_t>(run.first + run.step * n));
     }
-    g.Board = working;
-    for (size_t cell = 0; cell < g.Board.size(); ++cell)
-        if (g.Board[cell] == CLEARED) g.GreenFlag[cell] = false;
     if (runs.empty()) {
         TurnEnd(g);
         return;
     }
-    ui::Timer& blast = g.timers[kBlastTimer];
-    blast.tag = "8";
-    blast.SetEnabled(true);
+    StartBlast(g);
 }
 
 void BlastTick(Game& g)
 {
     ui::Timer& blast = g.timers[kBlastTimer];
-    const int step = TagNumber(blast.tag);
-    blast.tag = std::to_string(step - 1);
+    const int step = TakeStep(blast);
     if (step <= 5) {
         blast.SetEnabled(false);
         g.timers[kFallTimer].SetEnabled(true);
@@ -98,7 +91,7 @@ void BlastTick(Game& g)
     // Frames 12, 13, then nothing: the marking already showed frame 11.
     const int picture = step == 8 ? 12 : step == 7 ? 13 : kNoPicture;
     for (size_t cell = 11; cell <= 88; ++cell)
-        if (g.Board[cell] == CLEARED) g.ui.Cells[cell]->picture = ui::Palette(picture);
+        if (g.Board[cell] == CLEARED) g.screen.Cells[cell]->picture = ui::Palette(picture);
 }
 
 void FallTick(Game& g)
@@ -112,7 +105,7 @@ void FallTick(Game& g)
         g.GreenFlag[i] = g.GreenFlag[i - 10];
         g.GreenFlag[i - 10] = false;
         if (g.Board[i] != CLEARED) ShowCell(g, static_cast<int16_t>(i));
-        g.ui.Cells[i - 10]->picture = ui::Palette(kNoPicture);
+        g.screen.Cells[i - 10]->picture = ui::Palette(kNoPicture);
     }
     for (size_t i = 11; i <= 18; ++i) {
         if (g.Board[i] != CLEARED) continue;

@@ -30,7 +30,9 @@ void FallTick(Game& g);
 // Runs once per move, however long its cascade.
 void TurnEnd(Game& g);
 
-// True when nothing animates and no pause or failure runs, so the board may take presses again.
-bool NothingRunning(const Game& g);
+// Marks a cell for the blast: cleared, showing the first blast frame, its green tip gone.
+void ClearCell(Game& g, int16_t cell);
+// Blows up every cleared cell; the fall, any cascade and the turn end follow.
+void StartBlast(Game& g);
 
 }  // namespace kr

@@ -6,6 +6,7 @@
 #include "board/fill.h"
 #include "board/grid.h"
 #include "board/resolve.h"
+#include "hero/targeting.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
 #include "shell/timer_numbers.h"
@@ -22,8 +23,8 @@ int SparkleFor(int step)
 
 void ShowSelection(Game& g, int16_t cell)
 {
-    ui::Control& marker = *g.ui.SelectionMarker;
-    const ui::Control& image = *g.ui.Cells[static_cast<size_t>(cell)];
+    ui::Control& marker = *g.screen.SelectionMarker;
+    const ui::Control& image = *g.screen.Cells[static_cast<size_t>(cell)];
     marker.left = image.left;
     marker.top = image.top;
     marker.visible = true;
@@ -34,8 +35,7 @@ void ShowSelection(Game& g, int16_t cell)
 
 void CellPressed(Game& g, int16_t cell)
 {
-    if (!g.InputReady || !IsPlayable(cell)) return;
-    ui::Control& marker = *g.ui.SelectionMarker;
+    ui::Control& marker = *g.screen.SelectionMarker;
     if (marker.visible && cell == g.SelectedCell) {
         marker.visible = false;
         g.SelectedCell = -1;
@@ -51,9 +51,8 @@ void CellPressed(Game& g, int16_t cell)
     StartSwap(g, g.SelectedCell, cell);
     marker.visible = false;
     if (g.TeleportPending) {
-        g.form.pointer = ui::CursorPicture(ui::NormalCursor);
-        g.timers[kTargetBlinkTimer].SetEnabled(false);
         g.TeleportPending = false;
+        ShowBoardPointer(g);
     }
 }
 
@@ -61,9 +60,7 @@ void StartSwap(Game& g, int16_t from, int16_t to)
 {
     g.InputReady = false;
     g.SwapUnmatched = true;
-    ui::Timer& timer = g.timers[kSwapTimer];
-    timer.tag = "8";
-    timer.SetEnabled(true);
+    StartCountdown(g.timers[kSwapTimer], 8);
     g.SwapFrom = from;
     g.SwapTo = to;
 }
@@ -71,14 +68,13 @@ void StartSwap(Game& g, int16_t from, int16_t to)
 void SwapTick(Game& g)
 {
     ui::Timer& timer = g.timers[kSwapTimer];
-    const int step = TagNumber(timer.tag);
-    timer.tag = std::to_string(step - 1);
+    const int step = TakeStep(timer);
     const size_t from = static_cast<size_t>(g.SwapFrom);
     const size_t to = static_cast<size_t>(g.SwapTo);
     if (step > 1) {
         const ui::PictureRef sparkle = ui::Palette(SparkleFor(step));
-        g.ui.Cells[from]->picture = sparkle;
-        g.ui.Cells[to]->picture = sparkle;
+        g.screen.Cells[from]->picture = sparkle;
+        g.screen.Cells[to]->picture = sparkle;
         return;
     }
     std::swap(g.Board[from], g.Board[to]);

@@ -26,8 +26,8 @@ void ShrinkBar(ui::Control& bar, int16_t left, int16_t taken)
 
 void MarkGoalDone(Game& g, int panel, ui::Control& bar)
 {
-    g.ui.RequiredFrame[static_cast<size_t>(panel)]->visible = false;
-    g.ui.DoneFrame[static_cast<size_t>(panel)]->visible = true;
+    g.screen.RequiredFrame[static_cast<size_t>(panel)]->visible = false;
+    g.screen.DoneFrame[static_cast<size_t>(panel)]->visible = true;
     bar.width = 1;
 }
 
@@ -58,9 +58,9 @@ void ShootEnemy(Game& g, const int16_t& amount, const int16_t& greenTips)
         return;
     }
     const int16_t damage = To16((amount + g.Accuracy) * (greenTips + 1), "ShootEnemy");
-    ui::Control& bar = *g.ui.EnemyHealthBar;
-    ui::Control& marker = *g.ui.HitMarker;
-    if (bar.width < g.ui.BarOutlines[2]->width) {
+    ui::Control& bar = *g.screen.EnemyHealthBar;
+    ui::Control& marker = *g.screen.HitMarker;
+    if (bar.width < g.screen.BarOutlines[2]->width) {
         if (!marker.visible) {
             marker.left = bar.left + bar.width;
             marker.visible = true;
@@ -75,8 +75,8 @@ void ShootEnemy(Game& g, const int16_t& amount, const int16_t& greenTips)
         g.EnemyRequired = false;
         MarkGoalDone(g, kEnemyPanel, bar);
     }
-    g.ui.DamageLabel->top = g.ui.HealthLabel->top;
-    g.ui.HeroShotFrame->visible = true;
+    g.screen.DamageLabel->top = g.screen.HealthLabel->top;
+    g.screen.HeroShotFrame->visible = true;
     g.timers[kRiseTimer].SetEnabled(true);
 }
 
@@ -91,7 +91,7 @@ void DoEngineering(Game& g, const int16_t& amount)
     }
     Sound(g, PlayEngineer);
     int16_t& work = bomb ? g.BombWork : g.TerminalWork;
-    ui::Control& bar = bomb ? *g.ui.BombWorkBar : *g.ui.TerminalWorkBar;
+    ui::Control& bar = bomb ? *g.screen.BombWorkBar : *g.screen.TerminalWorkBar;
     work = To16(work - points, "DoEngineering");
     if (work > 0) {
         ShrinkBar(bar, work, points);
@@ -116,9 +116,9 @@ void HealHero(Game& g, const int16_t& amount)
 
 void DamageRiseTick(Game& g)
 {
-    ui::Control& label = *g.ui.DamageLabel;
+    ui::Control& label = *g.screen.DamageLabel;
     label.top -= 40;
-    if (label.top < 200) g.ui.HeroShotFrame->visible = false;
+    if (label.top < 200) g.screen.HeroShotFrame->visible = false;
     if (label.top < 50) {
         label.visible = false;
         g.timers[kRiseTimer].SetEnabled(false);
@@ -127,7 +127,7 @@ void DamageRiseTick(Game& g)
 
 void HitMarkerTick(Game& g)
 {
-    g.ui.HitMarker->visible = false;
+    g.screen.HitMarker->visible = false;
     g.timers[kMarkerTimer].SetEnabled(false);
 }
 

@@ -2,10 +2,11 @@
 
 #include <string>
 
-#include "board/resolve.h"
 #include "combat/outcome.h"
 #include "combat/stage.h"
+#include "hero/bullet_time.h"
 #include "hero/panel.h"
+#include "hero/targeting.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
 #include "shell/timer_numbers.h"
@@ -13,8 +14,6 @@
 
 namespace kr {
 namespace {
-
-bool BulletTimeRunning(const Game& g) { return g.timers[kBulletTimeDuration].Enabled(); }
 
 void Fire(Game& g)
 {
@@ -26,12 +25,12 @@ void Fire(Game& g)
         g.Health = To16(g.Health - damage, "EnemyAttackTick");
         RefreshHeroPanel(g);
         if (g.SoundOn == 1) PlayShot(g);
-        g.ui.DamageLabel->caption = std::to_string(damage);
-        g.ui.DamageLabel->visible = true;
+        g.screen.DamageLabel->caption = std::to_string(damage);
+        g.screen.DamageLabel->visible = true;
     } else if (g.SoundOn == 1) {
         PlayMiss(g);
     }
-    g.ui.DamageLabel->top = g.ui.HealthLabel->top;
+    g.screen.DamageLabel->top = g.screen.HealthLabel->top;
     g.timers[kRiseTimer].SetEnabled(true);
 }
 
@@ -54,18 +53,14 @@ void StartEnemyAttack(Game& g)
 {
     g.InputReady = false;
     g.form.pointer = ui::CursorPicture(ui::EnemyTurnCursor);
-    ui::Timer& attack = g.timers[kAttackTimer];
-    attack.tag = "4";
-    attack.SetEnabled(true);
+    StartCountdown(g.timers[kAttackTimer], 4);
 }
 
 void EnemyAttackTick(Game& g)
 {
     ui::Timer& attack = g.timers[kAttackTimer];
-    const int16_t blinksLeft = TagNumber(attack.tag);
-    ui::Control& frame = *g.ui.RequiredFrame[kEnemyPanel];
-    if (blinksLeft > 0) {
-        attack.tag = std::to_string(blinksLeft - 1);
+    ui::Control& frame = *g.screen.RequiredFrame[kEnemyPanel];
+    if (TakeStep(attack) > 0) {
         frame.visible = !frame.visible;
         return;
     }
@@ -73,24 +68,21 @@ void EnemyAttackTick(Game& g)
     if (!g.EnemyRequired) frame.visible = false;
     attack.SetEnabled(false);
     // A hero killed by this shot, or a renewal still filling, keeps the board locked.
-    if (NothingRunning(g)) g.InputReady = true;
-    g.form.pointer = ui::CursorPicture(ui::NormalCursor);
+    if (NothingRunning(g.timers)) g.InputReady = true;
+    ShowBoardPointer(g);
 }
 
 void StopMissionClocks(Game& g)
 {
     for (int timer = kFillTimer; timer <= kBombClock; ++timer) g.timers[timer].SetEnabled(false);
-    g.timers[kBombClock].SetInterval(kNormalBombInterval);
-    g.timers[kBulletTimeBar].SetEnabled(false);
-    g.ui.BulletTimeBar->visible = false;
-    g.timers[kBulletTimeDuration].SetEnabled(false);
+    EndBulletTime(g);
 }
 
 void BombClockTick(Game& g)
 {
     g.BombTicks = To16(g.BombTicks - 1, "BombClockTick");
     if (g.BombTicks > 0) {
-        ui::Control& bar = *g.ui.BombTimeBar;
+        ui::Control& bar = *g.screen.BombTimeBar;
         bar.width = static_cast<float>(static_cast<double>(bar.width) * g.BombTicks / (g.BombTicks + 1));
         return;
     }

@@ -4,6 +4,7 @@
 
 #include "combat/stage.h"
 #include "hero/levelup.h"
+#include "hero/targeting.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
 #include "shell/timer_numbers.h"
@@ -15,13 +16,11 @@ namespace {
 // "Zadanie wykonane!" and "Misja nieudana!" each blink ten times, 700 ms apart.
 constexpr int kBlinks = 10;
 
-// Toggles a blinking label and counts the timer's tag down; true when the count has run out.
+// Toggles a blinking label and takes a step of the timer's count; true when the count has run out.
 bool BlinkAndCount(ui::Timer& timer, ui::Control& label)
 {
     label.visible = !label.visible;
-    const int16_t left = static_cast<int16_t>(TagNumber(timer.tag) - 1);
-    timer.tag = std::to_string(left);
-    if (left != 0) return false;
+    if (TakeStep(timer) != 1) return false;
     timer.SetEnabled(false);
     label.visible = false;
     return true;
@@ -35,19 +34,17 @@ void StartFailure(Game& g)
 {
     g.InputReady = false;
     if (FailureRunning(g)) return;
-    g.ui.MissionFailedLabel->visible = true;
-    ui::Timer& failure = g.timers[kFailureTimer];
-    failure.tag = std::to_string(kBlinks);
-    failure.SetEnabled(true);
+    g.screen.MissionFailedLabel->visible = true;
+    StartCountdown(g.timers[kFailureTimer], kBlinks);
     if (g.SoundOn == 1) PlayDefeat(g);
     g.timers[kBombClock].SetEnabled(false);
 }
 
 void FailureTick(Game& g)
 {
-    if (!BlinkAndCount(g.timers[kFailureTimer], *g.ui.MissionFailedLabel)) return;
-    g.ui.MenuLayer->visible = true;
-    g.ui.MissionMenuScreen->visible = true;
+    if (!BlinkAndCount(g.timers[kFailureTimer], *g.screen.MissionFailedLabel)) return;
+    g.screen.MenuLayer->visible = true;
+    g.screen.MissionMenuScreen->visible = true;
 }
 
 void CheckStageDone(Game& g)
@@ -55,36 +52,34 @@ void CheckStageDone(Game& g)
     // A hero who died on this turn has lost, whatever the turn also finished.
     if (FailureRunning(g)) return;
     if (g.BombRequired || g.TerminalRequired || g.EnemyRequired) return;
-    ui::Timer& pause = g.timers[kStageDonePause];
-    pause.tag = std::to_string(kBlinks);
-    pause.SetEnabled(true);
+    StartCountdown(g.timers[kStageDonePause], kBlinks);
     g.timers[kBombClock].SetEnabled(false);
     g.timers[kAttackTimer].SetEnabled(false);
-    g.form.pointer = ui::CursorPicture(ui::NormalCursor);
+    ShowBoardPointer(g);
     if (g.SoundOn == 1) PlayGoalDone(g);
-    g.ui.StageDoneLabel->visible = true;
+    g.screen.StageDoneLabel->visible = true;
     g.InputReady = false;
 }
 
 void StageDoneTick(Game& g)
 {
-    if (!BlinkAndCount(g.timers[kStageDonePause], *g.ui.StageDoneLabel)) return;
+    if (!BlinkAndCount(g.timers[kStageDonePause], *g.screen.StageDoneLabel)) return;
     ++g.MissionStage;
     SetUpStage(g, g.ChosenMission, g.MissionStage);
 }
 
 void ShowMissionComplete(Game& g, const int16_t& mission)
 {
-    g.ui.MenuLayer->visible = true;
-    g.ui.MissionCompleteScreen->visible = true;
+    g.screen.MenuLayer->visible = true;
+    g.screen.MissionCompleteScreen->visible = true;
     if (g.SoundOn == 1) PlayMissionDone(g);
-    g.ui.MissionCompleteButton->tag = std::to_string(mission);
+    g.screen.MissionCompleteButton->tag = std::to_string(mission);
 }
 
 void MissionCompleteClicked(Game& g)
 {
-    g.ui.MissionCompleteScreen->visible = false;
-    const int16_t mission = TagNumber(g.ui.MissionCompleteButton->tag);
+    g.screen.MissionCompleteScreen->visible = false;
+    const int16_t mission = TagNumber(g.screen.MissionCompleteButton->tag);
     PrepareLevelUp(g, mission);
 }
 

@@ -16,7 +16,7 @@ constexpr float kSlotTops[3] = {0, 2220, 4440};
 void CopyObjectPicture(Game& g, int panel, int16_t picture)
 {
     if (picture == kKeepPicture) return;
-    g.ui.GoalPicture[static_cast<size_t>(panel)]->picture = g.ui.ObjectPictures[static_cast<size_t>(picture)]->picture;
+    g.screen.GoalPicture[static_cast<size_t>(panel)]->picture = g.screen.ObjectPictures[static_cast<size_t>(picture)]->picture;
 }
 
 void SetGoals(Game& g, const StageGoals& goals)
@@ -34,8 +34,8 @@ void SetGoals(Game& g, const StageGoals& goals)
         g.EnemyHealth = goals.enemy.health;
         g.EnemyAttack = goals.enemy.attack;
         g.EnemyHitChance = goals.enemy.hitChance;
-        g.ui.GoalPicture[kEnemyPanel]->picture =
-            g.ui.EnemyPortraits[static_cast<size_t>(goals.enemy.portrait)]->picture;
+        g.screen.GoalPicture[kEnemyPanel]->picture =
+            g.screen.EnemyPortraits[static_cast<size_t>(goals.enemy.portrait)]->picture;
     }
     if (goals.terminal.need != Need::Absent) {
         g.TerminalPresent = true;
@@ -51,11 +51,11 @@ void PlacePanels(Game& g)
     const bool required[3] = {g.BombRequired, g.EnemyRequired, g.TerminalRequired};
     size_t slot = 0;
     auto place = [&](int panel, bool framed) {
-        ui::Control& frame = *g.ui.GoalPanel[static_cast<size_t>(panel)];
+        ui::Control& frame = *g.screen.GoalPanel[static_cast<size_t>(panel)];
         frame.left = 6840;
         frame.top = kSlotTops[slot++];
         frame.visible = true;
-        if (framed) g.ui.RequiredFrame[static_cast<size_t>(panel)]->visible = true;
+        if (framed) g.screen.RequiredFrame[static_cast<size_t>(panel)]->visible = true;
     };
     for (int panel = 0; panel < 3; ++panel)
         if (required[panel]) place(panel, true);
@@ -67,20 +67,20 @@ void PlacePanels(Game& g)
 
 void SetUpStage(Game& g, const int16_t& mission, const int16_t& stage)
 {
-    g.ui.SelectionMarker->visible = false;
-    for (size_t s = 0; s < g.ui.SkillFrames.size(); ++s)
-        g.ui.SkillFrames[s]->visible = g.UnlockedMissions > static_cast<int>(s);
+    g.screen.SelectionMarker->visible = false;
+    for (size_t s = 0; s < g.screen.SkillFrames.size(); ++s)
+        g.screen.SkillFrames[s]->visible = g.UnlockedMissions > static_cast<int>(s);
     g.Resources.fill(0);
     g.Health = g.MaxHealth;
     RefreshHeroPanel(g);
 
     for (size_t panel = 0; panel < 3; ++panel) {
-        g.ui.GoalPanel[panel]->visible = false;
-        g.ui.DoneFrame[panel]->visible = false;
-        g.ui.RequiredFrame[panel]->visible = false;
+        g.screen.GoalPanel[panel]->visible = false;
+        g.screen.DoneFrame[panel]->visible = false;
+        g.screen.RequiredFrame[panel]->visible = false;
     }
-    ui::Control* const fills[4] = {g.ui.BombWorkBar, g.ui.BombTimeBar, g.ui.EnemyHealthBar, g.ui.TerminalWorkBar};
-    for (size_t bar = 0; bar < g.ui.BarOutlines.size(); ++bar) fills[bar]->width = g.ui.BarOutlines[bar]->width;
+    ui::Control* const fills[4] = {g.screen.BombWorkBar, g.screen.BombTimeBar, g.screen.EnemyHealthBar, g.screen.TerminalWorkBar};
+    for (size_t bar = 0; bar < g.screen.BarOutlines.size(); ++bar) fills[bar]->width = g.screen.BarOutlines[bar]->width;
     g.BombPresent = g.EnemyPresent = g.TerminalPresent = false;
     g.BombRequired = g.EnemyRequired = g.TerminalRequired = false;
     g.ImmobilisedTurns = 0;
@@ -95,7 +95,7 @@ void SetUpStage(Game& g, const int16_t& mission, const int16_t& stage)
         return;
     }
 
-    g.ui.MenuLayer->visible = false;
+    g.screen.MenuLayer->visible = false;
     PlacePanels(g);
     g.InputReady = false;
     if (g.SoundOn == 1) PlayStart(g);

@@ -32,27 +32,27 @@ void PrepareLevelUp(Game& g, const int16_t& mission)
     EnableMissionButtons(g);
     const int spent = g.Strength + g.Intelligence + g.Dexterity + g.Endurance + g.Accuracy;
     if (spent >= g.UnlockedMissions - 1) {
-        g.ui.MissionMenuScreen->visible = true;
+        g.screen.MissionMenuScreen->visible = true;
         return;
     }
-    g.ui.LevelUpOk->visible = false;
-    for (size_t i = 0; i < g.ui.AttributePips.size(); ++i) {
-        if (i < g.ui.PlusLabels.size()) g.ui.PlusLabels[i]->visible = true;
-        g.ui.AttributePips[i]->visible = false;
+    g.screen.LevelUpOk->visible = false;
+    for (size_t i = 0; i < g.screen.AttributePips.size(); ++i) {
+        if (i < g.screen.PlusLabels.size()) g.screen.PlusLabels[i]->visible = true;
+        g.screen.AttributePips[i]->visible = false;
     }
     for (int row = 0; row < 5; ++row) {
         const int16_t points = AttributeOfRow(g, row);
         const size_t r = static_cast<size_t>(row);
-        if (points > 0) g.ui.AttributePips[2 * r]->visible = true;
+        if (points > 0) g.screen.AttributePips[2 * r]->visible = true;
         // A hand-edited file may hold more than the cap: no "+" is ever offered from 2 up.
         if (points >= kAttributeMaximum) {
-            g.ui.AttributePips[2 * r + 1]->visible = true;
-            g.ui.PlusLabels[r]->visible = false;
+            g.screen.AttributePips[2 * r + 1]->visible = true;
+            g.screen.PlusLabels[r]->visible = false;
         }
     }
-    g.ui.LevelUpScreen->visible = true;
-    g.ui.AttributeDescription->caption.clear();
-    g.ui.AttributeDescription->visible = true;
+    g.screen.LevelUpScreen->visible = true;
+    g.screen.AttributeDescription->caption.clear();
+    g.screen.AttributeDescription->visible = true;
 }
 
 void PlusClicked(Game& g, int row)
@@ -60,17 +60,17 @@ void PlusClicked(Game& g, int row)
     int16_t& attribute = AttributeOfRow(g, row);
     ++attribute;
     const size_t r = static_cast<size_t>(row);
-    g.ui.AttributePips[2 * r]->visible = true;
-    if (attribute >= kAttributeMaximum) g.ui.AttributePips[2 * r + 1]->visible = true;
-    for (ui::Control* plus : g.ui.PlusLabels) plus->visible = false;
-    g.ui.AttributeDescription->visible = false;
-    g.ui.LevelUpOk->visible = true;
+    g.screen.AttributePips[2 * r]->visible = true;
+    if (attribute >= kAttributeMaximum) g.screen.AttributePips[2 * r + 1]->visible = true;
+    for (ui::Control* plus : g.screen.PlusLabels) plus->visible = false;
+    g.screen.AttributeDescription->visible = false;
+    g.screen.LevelUpOk->visible = true;
 }
 
 void LevelUpOkClicked(Game& g)
 {
-    g.ui.LevelUpScreen->visible = false;
-    g.ui.MissionMenuScreen->visible = true;
+    g.screen.LevelUpScreen->visible = false;
+    g.screen.MissionMenuScreen->visible = true;
     SaveProgress(g);
 }
 

@@ -1,6 +1,8 @@
 #include "shell/briefing.h"
 
 #include "combat/stage.h"
+#include "hero/bullet_time.h"
+#include "hero/targeting.h"
 #include "shell/arithmetic.h"
 #include "shell/game.h"
 #include "shell/timer_numbers.h"
@@ -23,8 +25,8 @@ size_t CharacterLength(unsigned char lead)
 
 void EnableMissionButtons(Game& g)
 {
-    for (size_t i = 0; i < g.ui.MissionButtons.size(); ++i)
-        g.ui.MissionButtons[i]->enabled = g.UnlockedMissions > static_cast<int>(i);
+    for (size_t i = 0; i < g.screen.MissionButtons.size(); ++i)
+        g.screen.MissionButtons[i]->enabled = g.UnlockedMissions > static_cast<int>(i);
 }
 
 int16_t MaxHealthFor(int16_t mission, int16_t endurance)
@@ -38,9 +40,9 @@ void MissionChosen(Game& g, int16_t mission)
 {
     if (mission >= 0 && mission <= 9) g.BriefingText = kBriefings[static_cast<size_t>(mission)];
     g.MaxHealth = MaxHealthFor(mission, g.Endurance);
-    g.ui.MissionMenuScreen->visible = false;
-    g.ui.BriefingScreen->visible = true;
-    g.ui.BriefingLabel->caption.clear();
+    g.screen.MissionMenuScreen->visible = false;
+    g.screen.BriefingScreen->visible = true;
+    g.screen.BriefingLabel->caption.clear();
     g.timers[kTypewriterTimer].SetEnabled(true);
     g.MissionStage = 0;
     g.ChosenMission = mission;
@@ -53,23 +55,28 @@ void TypewriterTick(Game& g)
         return;
     }
     const size_t length = std::min(CharacterLength(static_cast<unsigned char>(g.BriefingText[0])), g.BriefingText.size());
-    g.ui.BriefingLabel->caption += g.BriefingText.substr(0, length);
+    g.screen.BriefingLabel->caption += g.BriefingText.substr(0, length);
     g.BriefingText.erase(0, length);
 }
 
 void StartMissionClicked(Game& g)
 {
-    g.ui.BriefingScreen->visible = false;
-    g.ui.MissionMenuScreen->visible = false;
+    g.screen.BriefingScreen->visible = false;
+    g.screen.MissionMenuScreen->visible = false;
     PlaceTutorialPanel(g);
+    // Nothing paid for in another mission carries into this one: no armed target, no slow time, no deadly
+    // bullets.
+    ClearTargeting(g);
+    EndBulletTime(g);
+    g.DeadlyBulletsTurns = 0;
     const int16_t firstStage = 0;
     SetUpStage(g, g.ChosenMission, firstStage);
 }
 
 void BriefingBackClicked(Game& g)
 {
-    g.ui.BriefingScreen->visible = false;
-    g.ui.MissionMenuScreen->visible = true;
+    g.screen.BriefingScreen->visible = false;
+    g.screen.MissionMenuScreen->visible = true;
 }
 
 }  // namespace kr

@@ -4,12 +4,18 @@
 #include "board/moves.h"
 #include "board/resolve.h"
 #include "board/swap.h"
+#include "board/targets.h"
 #include "combat/effects.h"
 #include "combat/enemy.h"
 #include "combat/outcome.h"
+#include "hero/bullet_time.h"
+#include "hero/descriptions.h"
 #include "hero/levelup.h"
+#include "hero/skills.h"
+#include "hero/targeting.h"
 #include "shell/briefing.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "shell/screens.h"
 #include "shell/tutorial.h"
 
@@ -28,7 +34,7 @@ void OnTick(Game& g, int timer, void (*handler)(Game&))
 
 void ConnectMenus(Game& g)
 {
-    Screen& s = g.ui;
+    Screen& s = g.screen;
     OnClick(s.PlayButton, g, PlayClicked);
     OnClick(s.OptionsButton, g, OptionsClicked);
     OnClick(s.ExitButton, g, ExitClicked);
@@ -53,25 +59,75 @@ void ConnectMenus(Game& g)
 
 void ConnectBoard(Game& g)
 {
-    for (size_t cell = 0; cell < g.ui.Cells.size(); ++cell)
-        g.ui.Cells[cell]->onMouseDown = [&g, cell] { CellPressed(g, static_cast<int16_t>(cell)); };
+    for (size_t cell = 0; cell < g.screen.Cells.size(); ++cell)
+        g.screen.Cells[cell]->onMouseDown = [&g, cell] { BoardPressed(g, static_cast<int16_t>(cell)); };
+}
+
+// A skill is used by a press on its frame, its icon or one of its price slots, or by a click on a "5x".
+void ConnectSkills(Game& g)
+{
+    Screen& s = g.screen;
+    auto use = [&g](int16_t skill) { return [&g, skill] { UseSkill(g, skill); }; };
+    for (size_t k = 0; k < s.SkillFrames.size(); ++k) {
+        const auto skill = static_cast<int16_t>(k);
+        s.SkillFrames[k]->onMouseDown = use(skill);
+        s.SkillIcons[k]->onMouseDown = use(skill);
+    }
+    for (size_t slot = 0; slot < s.CostIcons.size(); ++slot)
+        s.CostIcons[slot]->onMouseDown = use(SkillOfCostSlot(static_cast<int>(slot)));
+    for (ui::Control* label : s.FiveTimesLabels) label->onClick = use(kDeadlyBullets);
+}
+
+// Moving over a skill or the hero describes it; moving over the board or a background clears the text.
+void ConnectDescriptions(Game& g)
+{
+    Screen& s = g.screen;
+    auto describe = [&g](int16_t skill) { return [&g, skill] { ShowSkillDescription(g, skill); }; };
+    for (size_t k = 0; k < s.SkillFrames.size(); ++k) {
+        const auto skill = static_cast<int16_t>(k);
+        s.SkillFrames[k]->onMouseMove = describe(skill);
+        s.SkillIcons[k]->onMouseMove = describe(skill);
+    }
+    for (size_t slot = 0; slot < s.CostIcons.size(); ++slot)
+        s.CostIcons[slot]->onMouseMove = describe(SkillOfCostSlot(static_cast<int>(slot)));
+    for (ui::Control* label : s.FiveTimesLabels) label->onMouseMove = describe(kDeadlyBullets);
+
+    const auto hero = [&g] { ShowHeroAttributes(g); };
+    s.HeroPanel->onMouseMove = hero;
+    s.HeroPortrait->onMouseMove = hero;
+    for (ui::Control* icon : s.ResourceIcons) icon->onMouseMove = hero;
+
+    const auto clear = [&g] { ClearDescription(g); };
+    g.form.onBackgroundMouseMove = clear;
+    s.SkillPanel->onMouseMove = clear;
+    for (ui::Control* cell : s.Cells) cell->onMouseMove = clear;
+
+    for (size_t r = 0; r < s.PlusLabels.size(); ++r) {
+        const auto row = static_cast<int>(r);
+        const auto attribute = [&g, row] { ShowAttributeDescription(g, row); };
+        s.LevelUpLabels[r + 1]->onMouseMove = attribute;
+        s.PlusLabels[r]->onMouseMove = attribute;
+    }
 }
 
 void ConnectTimers(Game& g)
 {
-    OnTick(g, 1, FillTick);
-    OnTick(g, 2, SwapTick);
-    OnTick(g, 3, BlastTick);
-    OnTick(g, 4, FallTick);
-    OnTick(g, 5, TypewriterTick);
-    OnTick(g, 6, BombClockTick);
-    OnTick(g, 7, StageDoneTick);
-    OnTick(g, 8, NoMovesTick);
-    OnTick(g, 9, FailureTick);
-    OnTick(g, 10, DamageRiseTick);
-    OnTick(g, 11, EnemyAttackTick);
-    OnTick(g, 12, HitMarkerTick);
-    OnTick(g, 16, HintTimerTick);
+    OnTick(g, kFillTimer, FillTick);
+    OnTick(g, kSwapTimer, SwapTick);
+    OnTick(g, kBlastTimer, BlastTick);
+    OnTick(g, kFallTimer, FallTick);
+    OnTick(g, kTypewriterTimer, TypewriterTick);
+    OnTick(g, kBombClock, BombClockTick);
+    OnTick(g, kStageDonePause, StageDoneTick);
+    OnTick(g, kNoMovesTimer, NoMovesTick);
+    OnTick(g, kFailureTimer, FailureTick);
+    OnTick(g, kRiseTimer, DamageRiseTick);
+    OnTick(g, kAttackTimer, EnemyAttackTick);
+    OnTick(g, kMarkerTimer, HitMarkerTick);
+    OnTick(g, kTargetBlinkTimer, TargetBlinkTick);
+    OnTick(g, kBulletTimeDuration, BulletTimeTick);
+    OnTick(g, kBulletTimeBar, BulletTimeBarTick);
+    OnTick(g, kHintTimer, HintTimerTick);
 }
 
 }  // namespace
@@ -80,6 +136,8 @@ void ConnectHandlers(Game& g)
 {
     ConnectMenus(g);
     ConnectBoard(g);
+    ConnectSkills(g);
+    ConnectDescriptions(g);
     ConnectTimers(g);
 }
 

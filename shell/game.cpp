@@ -1,7 +1,4 @@
 #include "shell/game.h"
-#include "shell/timer_numbers.h"
-
-#include "shell/events.h"
 
 namespace kr {
 namespace {
@@ -14,12 +11,9 @@ constexpr int kIntervals[ui::TimerBank::kCount] = {30, 30, 45, 75, 10, 100, 700,
 
 Game::Game(Host services, std::filesystem::path progress) : host(services), progressFile(std::move(progress))
 {
-    BuildScreen(form, ui);
+    BuildScreen(form, screen);
     for (int number = 1; number <= ui::TimerBank::kCount; ++number)
         timers[number].SetInterval(kIntervals[number - 1]);
-    // The hint timer runs from the moment the window exists.
-    timers[kHintTimer].SetEnabled(true);
-    ConnectHandlers(*this);
 }
 
 }  // namespace kr

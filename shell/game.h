@@ -19,7 +19,8 @@ struct Host {
 };
 
 // The one game object: every piece of state the rules name, the window's controls, its timers and the one
-// random generator. Procedures live with their subsystem and work on this state.
+// random generator. It is plain state: procedures live with their subsystem, and the start-up connects them
+// to the controls and timers.
 class Game {
 public:
     explicit Game(Host host, std::filesystem::path progressFile = "config.cfg");
@@ -28,7 +29,7 @@ public:
 
     ui::Form form;
     ui::TimerBank timers;
-    Screen ui;
+    Screen screen;
     Random random;
     Host host;
     std::filesystem::path progressFile;
@@ -46,6 +47,8 @@ public:
     bool SwapUnmatched = false;
     bool TeleportPending = false;
     bool BlastPending = false;
+    // A grenade paid for and not yet thrown: the next board press throws it.
+    bool GrenadePending = false;
 
     // Hero (attributes in their storage order)
     int16_t Strength = 0;

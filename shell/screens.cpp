@@ -1,6 +1,8 @@
 #include "shell/screens.h"
 
 #include "combat/enemy.h"
+#include "hero/descriptions.h"
+#include "hero/targeting.h"
 #include "shell/briefing.h"
 #include "shell/game.h"
 #include "shell/timer_numbers.h"
@@ -22,10 +24,10 @@ void SetCheckBox(ui::Control& box, int16_t value, void (*clicked)(Game&), Game& 
 
 void KeyDown(Game& g, int keyCode)
 {
-    if (g.ui.MenuLayer->visible) return;
+    if (g.screen.MenuLayer->visible) return;
     switch (keyCode) {
-    case kEscapeKey: g.ui.ReturnPrompt->visible = !g.ui.ReturnPrompt->visible; break;
-    case kKeyN: g.ui.ReturnPrompt->visible = false; break;
+    case kEscapeKey: g.screen.ReturnPrompt->visible = !g.screen.ReturnPrompt->visible; break;
+    case kKeyN: g.screen.ReturnPrompt->visible = false; break;
     case kKeyT: ReturnToMenu(g); break;
     default: break;
     }
@@ -33,46 +35,46 @@ void KeyDown(Game& g, int keyCode)
 
 void ReturnToMenu(Game& g)
 {
-    g.ui.ReturnPrompt->visible = false;
-    g.ui.MenuLayer->visible = true;
-    g.ui.MainMenuScreen->visible = true;
+    g.screen.ReturnPrompt->visible = false;
+    g.screen.MenuLayer->visible = true;
+    g.screen.MainMenuScreen->visible = true;
     StopMissionClocks(g);
     // The stage-done pause, the failure and the enemy's attack belong to the mission being left:
     // left running they would carry on under the menu.
     for (int timer : {kStageDonePause, kFailureTimer, kAttackTimer}) g.timers[timer].SetEnabled(false);
-    g.ui.StageDoneLabel->visible = false;
-    g.ui.MissionFailedLabel->visible = false;
-    g.form.pointer = ui::CursorPicture(ui::NormalCursor);
+    g.screen.StageDoneLabel->visible = false;
+    g.screen.MissionFailedLabel->visible = false;
+    ClearTargeting(g);
 }
 
 void PlayClicked(Game& g)
 {
     EnableMissionButtons(g);
-    g.ui.MainMenuScreen->visible = false;
-    g.ui.MissionMenuScreen->visible = true;
+    g.screen.MainMenuScreen->visible = false;
+    g.screen.MissionMenuScreen->visible = true;
 }
 
 void OptionsClicked(Game& g)
 {
-    g.ui.HeroSummary->caption = HeroSummaryText(g);
-    g.ui.HeroSummary->visible = true;
-    SetCheckBox(*g.ui.SoundBox, g.SoundOn, SoundBoxClicked, g);
-    SetCheckBox(*g.ui.TutorialBox, g.TutorialOn, TutorialBoxClicked, g);
-    g.ui.MainMenuScreen->visible = false;
-    g.ui.OptionsScreen->visible = true;
+    g.screen.HeroSummary->caption = HeroAttributesText(g);
+    g.screen.HeroSummary->visible = true;
+    SetCheckBox(*g.screen.SoundBox, g.SoundOn, SoundBoxClicked, g);
+    SetCheckBox(*g.screen.TutorialBox, g.TutorialOn, TutorialBoxClicked, g);
+    g.screen.MainMenuScreen->visible = false;
+    g.screen.OptionsScreen->visible = true;
 }
 
 void ExitClicked(Game& g) { g.quitRequested = true; }
 
 void MissionMenuBackClicked(Game& g)
 {
-    g.ui.MissionMenuScreen->visible = false;
-    g.ui.MainMenuScreen->visible = true;
+    g.screen.MissionMenuScreen->visible = false;
+    g.screen.MainMenuScreen->visible = true;
 }
 
-void SoundBoxClicked(Game& g) { g.SoundOn = g.ui.SoundBox->value; }
+void SoundBoxClicked(Game& g) { g.SoundOn = g.screen.SoundBox->value; }
 
-void TutorialBoxClicked(Game& g) { g.TutorialOn = g.ui.TutorialBox->value; }
+void TutorialBoxClicked(Game& g) { g.TutorialOn = g.screen.TutorialBox->value; }
 
 void ResetClicked(Game& g)
 {
@@ -82,24 +84,16 @@ void ResetClicked(Game& g)
     g.Strength = g.Dexterity = g.Intelligence = g.Accuracy = g.Endurance = 0;
     g.UnlockedMissions = 1;
     SaveProgress(g);
-    g.ui.HeroSummary->caption = HeroSummaryText(g);
-    g.ui.HeroSummary->visible = true;
+    g.screen.HeroSummary->caption = HeroAttributesText(g);
+    g.screen.HeroSummary->visible = true;
 }
 
 void OptionsBackClicked(Game& g)
 {
     SaveProgress(g);
-    g.ui.OptionsScreen->visible = false;
-    g.ui.MainMenuScreen->visible = true;
+    g.screen.OptionsScreen->visible = false;
+    g.screen.MainMenuScreen->visible = true;
 }
 
-std::string HeroSummaryText(const Game& g)
-{
-    return "MOC:          " + std::to_string(g.Strength) + "\r\n" +
-           "ZRĘCZNOŚĆ:    " + std::to_string(g.Dexterity) + "\r\n" +
-           "CELNOŚĆ:      " + std::to_string(g.Accuracy) + "\r\n" +
-           "WYTRZYMAŁOŚĆ: " + std::to_string(g.Endurance) + "\r\n" +
-           "INTELIGENCJA: " + std::to_string(g.Intelligence);
-}
 
 }  // namespace kr

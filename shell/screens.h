@@ -1,5 +1,4 @@
 #pragma once
-#include <string>
 
 namespace kr {
 
@@ -24,7 +23,5 @@ void SoundBoxClicked(Game& g);
 void TutorialBoxClicked(Game& g);
 void ResetClicked(Game& g);
 void OptionsBackClicked(Game& g);
-// Five lines, a 14-character caption and the value each, in display order.
-std::string HeroSummaryText(const Game& g);
 
 }  // namespace kr

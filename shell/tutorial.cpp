@@ -24,8 +24,8 @@ int16_t DrawFirstHint(Game& g) { return DrawPage(g, 14); }
 
 void ShowHint(Game& g, int16_t page)
 {
-    g.ui.HintLabel->caption = g.TutorialTexts[static_cast<size_t>(page)];
-    g.ui.PageLabel->caption = std::to_string(page);
+    g.screen.HintLabel->caption = g.TutorialTexts[static_cast<size_t>(page)];
+    g.screen.PageLabel->caption = std::to_string(page);
     g.TutorialPage = page;
 }
 
@@ -43,15 +43,15 @@ void PreviousHint(Game& g)
 
 void HintTimerTick(Game& g) { ShowHint(g, DrawPage(g, 15)); }
 
-void CloseHints(Game& g) { g.ui.TutorialPanel->top = 5000; }
+void CloseHints(Game& g) { g.screen.TutorialPanel->top = 5000; }
 
 void PlaceTutorialPanel(Game& g)
 {
     if (g.TutorialOn == 1) {
-        g.ui.TutorialPanel->left = 120;
-        g.ui.TutorialPanel->top = 120;
+        g.screen.TutorialPanel->left = 120;
+        g.screen.TutorialPanel->top = 120;
     } else {
-        g.ui.TutorialPanel->top = 2000;
+        g.screen.TutorialPanel->top = 2000;
     }
 }
 

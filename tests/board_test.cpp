@@ -69,7 +69,7 @@ TEST(BoardFill, NoReadyMadeRunsAndTheBorderHoldsOverManySeeds)
         for (int cell : borders) {
             ASSERT_EQ(s.game.Board[static_cast<size_t>(cell)], BORDER) << cell;
             ASSERT_EQ(s.Print("Image1(" + std::to_string(cell) + ").Picture"), "palette 14");
-            ASSERT_FALSE(s.game.ui.Cells[static_cast<size_t>(cell)]->enabled);
+            ASSERT_FALSE(s.game.screen.Cells[static_cast<size_t>(cell)]->enabled);
         }
         for (int cell = 11; cell <= 88; ++cell)
             if (IsPlayable(cell)) {

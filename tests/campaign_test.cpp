@@ -52,7 +52,7 @@ void WinMission(Session& s, int m, int lastStage)
     ASSERT_TRUE(s.game.InputReady);
     s.Run("set EnemyHitChance 0\nset EnemyHealth 1\nset TerminalWork 1\nset BombWork 1");
     PlayRun(s, s.game.EnemyRequired ? '1' : '4');
-    s.AdvanceUntil([&] { return s.game.ui.MissionCompleteScreen->visible; });
+    s.AdvanceUntil([&] { return s.game.screen.MissionCompleteScreen->visible; });
 }
 
 std::string Shown(Session& s, const std::string& control) { return s.Print(control + ".Visible"); }
@@ -75,7 +75,7 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     // The door: opened by a real move, then "Zadanie wykonane!" blinks ten times 700 ms apart.
     s.Run("set TerminalWork 1");
     PlayRun(s, '4');
-    const int64_t done = s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
+    const int64_t done = s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
     EXPECT_EQ(s.Print("Timer7.Tag"), "\"10\"");
     EXPECT_EQ(s.Print("Timer7.Interval"), "700");
     EXPECT_EQ(s.Print("DoneFrame(2).Visible"), "True");
@@ -106,7 +106,7 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     ASSERT_TRUE(s.game.InputReady);
     s.Run("set EnemyHealth 1");
     PlayRun(s, '1');
-    const int64_t beaten = s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
+    const int64_t beaten = s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
     s.Advance(6999);
     EXPECT_EQ(Shown(s, "MissionCompleteScreen"), "False");
     s.Advance(1);
@@ -227,7 +227,7 @@ TEST(CampaignFailure, ALostMissionChangesNoSavedValue)
     s.SetBoard(RunOfThree('0').replace(0, 4, "0230"));  // swapping 13 and 14 lines nothing up
     s.Press(13);
     s.Press(14);
-    s.AdvanceUntil([&] { return s.game.ui.MissionMenuScreen->visible; });
+    s.AdvanceUntil([&] { return s.game.screen.MissionMenuScreen->visible; });
     EXPECT_EQ(ReadFile(s.folder().File("config.cfg")), saved);
     EXPECT_FALSE(fs::exists(s.folder().File("config.cfg.tmp")));
     EXPECT_EQ(s.game.UnlockedMissions, 3);
@@ -249,8 +249,8 @@ TEST(CampaignStageEnd, ADoorOpenedOnATurnThatLeavesNoMoveClosesTheStageOnTheNext
         s.SetBoard(nearlyDead);
         s.Press(13);
         s.Press(14);
-        s.AdvanceUntil([&] { return s.game.ui.NoMovesLabel->visible || s.game.ui.StageDoneLabel->visible; });
-        if (!s.game.ui.NoMovesLabel->visible) continue;  // this refill left a move: try another seed
+        s.AdvanceUntil([&] { return s.game.screen.NoMovesLabel->visible || s.game.screen.StageDoneLabel->visible; });
+        if (!s.game.screen.NoMovesLabel->visible) continue;  // this refill left a move: try another seed
 
         EXPECT_FALSE(s.game.TerminalRequired);
         EXPECT_EQ(Shown(s, "DoneFrame(2)"), "True");
@@ -260,7 +260,7 @@ TEST(CampaignStageEnd, ADoorOpenedOnATurnThatLeavesNoMoveClosesTheStageOnTheNext
         ASSERT_TRUE(s.game.InputReady);
         EXPECT_FALSE(s.game.timers[7].Enabled());
         PlayRun(s, '0');
-        s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
+        s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
         s.Advance(7000);
         EXPECT_EQ(s.game.MissionStage, 1);
         return;
@@ -318,12 +318,12 @@ constexpr StageRow kStages[] = {
 void Scuff(Session& s)
 {
     Game& g = s.game;
-    for (ui::Control* bar : {g.ui.BombWorkBar, g.ui.BombTimeBar, g.ui.EnemyHealthBar, g.ui.TerminalWorkBar})
+    for (ui::Control* bar : {g.screen.BombWorkBar, g.screen.BombTimeBar, g.screen.EnemyHealthBar, g.screen.TerminalWorkBar})
         bar->width = 1;
     for (size_t panel = 0; panel < 3; ++panel) {
-        g.ui.GoalPanel[panel]->visible = true;
-        g.ui.DoneFrame[panel]->visible = true;
-        g.ui.RequiredFrame[panel]->visible = true;
+        g.screen.GoalPanel[panel]->visible = true;
+        g.screen.DoneFrame[panel]->visible = true;
+        g.screen.RequiredFrame[panel]->visible = true;
     }
     g.Health = 3;
     g.Resources.fill(5);
@@ -403,8 +403,8 @@ TEST(CampaignStages, EveryStagePlacesItsPanelsMandatoryFirst)
     for (int m = 0; m < 10; ++m) {
         SCOPED_TRACE("mission " + std::to_string(m));
         Scuff(s);
-        s.game.ui.MissionCompleteScreen->visible = false;
-        s.game.ui.MenuLayer->visible = false;
+        s.game.screen.MissionCompleteScreen->visible = false;
+        s.game.screen.MenuLayer->visible = false;
         s.game.timers[1].SetEnabled(false);
         s.Run("call SetUpStage " + std::to_string(m) + " " + std::to_string(stageCounts[m]));
         EXPECT_EQ(Shown(s, "MissionCompleteScreen"), "True");

@@ -9,6 +9,7 @@
 
 #include "board/moves.h"
 #include "board/resolve.h"
+#include "shell/timer_numbers.h"
 #include "tests/session.h"
 
 namespace kr {
@@ -84,7 +85,7 @@ void Set(Session& s, std::initializer_list<std::string> assignments)
 // Until the board is the player's again: nothing animating, no attack, input released.
 void Settle(Session& s)
 {
-    s.AdvanceUntil([&] { return s.game.InputReady && NothingRunning(s.game); });
+    s.AdvanceUntil([&] { return s.game.InputReady && NothingRunning(s.game.timers); });
 }
 
 // The channels played since the last call.
@@ -197,7 +198,7 @@ TEST(FightShots, AnOverkillShotFinishesTheEnemyAndItNeverShootsBack)
     EXPECT_EQ(s.Print("EnemyHealthBar.Width"), "1");
     EXPECT_EQ(s.Print("HitMarker.Visible"), "False");
 
-    s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
+    s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
     EXPECT_FALSE(s.game.timers[11].Enabled()) << "a dead enemy takes no turn";
     EXPECT_EQ(s.game.Health, 30);
     EXPECT_EQ(s.game.DeadlyBulletsTurns, 0);
@@ -240,7 +241,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         EXPECT_EQ(Sounds(s), std::vector<int>{5});
         EXPECT_EQ(s.game.Resources[4], 1);
         Settle(s);
-        EXPECT_FALSE(s.game.ui.StageDoneLabel->visible) << "the terminal is still required";
+        EXPECT_FALSE(s.game.screen.StageDoneLabel->visible) << "the terminal is still required";
         EXPECT_TRUE(s.game.timers[6].Enabled());
 
         // Next, the required terminal.
@@ -260,7 +261,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         Settle(s);
         s.Run("set TerminalWork 1");
         StartRun(s, "444");
-        s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
+        s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
         EXPECT_EQ(s.game.BombWork, 100);
         EXPECT_TRUE(s.game.BombPresent);
         const int16_t ticks = s.game.BombTicks;
@@ -283,7 +284,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         s.Advance(1000);
         EXPECT_TRUE(s.game.timers[6].Enabled());
         EXPECT_EQ(s.game.BombTicks, ticks - 10);
-        EXPECT_FALSE(s.game.ui.StageDoneLabel->visible);
+        EXPECT_FALSE(s.game.screen.StageDoneLabel->visible);
     }
     {
         // No door, terminal or bomb: an impact, but the wrench still pays its resource point.
@@ -393,7 +394,7 @@ TEST(FightEnemyTurn, AnOptionalEnemyBlinksWithoutAFrameAndAStageEndCutsItsShotOf
     Lay(s, RunOfThree("444"));
     Sounds(s);
     Swap(s, 13, 14);
-    s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
+    s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
     EXPECT_FALSE(s.game.timers[11].Enabled());
     EXPECT_EQ(s.Print("Pointer"), "NormalCursor");
     EXPECT_FALSE(s.game.InputReady);
@@ -452,10 +453,10 @@ TEST(FightBomb, TheClockStartsWhenTheBoardHasFilledAndTheBarFollowsTheTicks)
     EXPECT_EQ(s.game.BombTicks, 1500);
     s.Advance(1);
     EXPECT_EQ(s.game.BombTicks, 1499);
-    EXPECT_NEAR(s.game.ui.BombTimeBar->width, 735.0 * 1499 / 1500, 0.001);
+    EXPECT_NEAR(s.game.screen.BombTimeBar->width, 735.0 * 1499 / 1500, 0.001);
     s.Advance(900);
     EXPECT_EQ(s.game.BombTicks, 1490);
-    EXPECT_NEAR(s.game.ui.BombTimeBar->width, 735.0 * 1490 / 1500, 0.01);
+    EXPECT_NEAR(s.game.screen.BombTimeBar->width, 735.0 * 1490 / 1500, 0.01);
 
     // A new stage's board fills with the clock stopped, whatever the last stage left running.
     s.Run("call SetUpStage 2 2");
@@ -645,7 +646,7 @@ TEST(FightEndings, KeyTLeavesDuringTheStagePauseTheFailureOrTheEnemyTurn)
         Enter(s, 0, 0);
         s.Run("set TerminalWork 1");
         StartRun(s, "444");
-        s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
+        s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
         s.Advance(1000);
         s.Key(84);
         ExpectLeftForGood(s, 0, 30);

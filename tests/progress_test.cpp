@@ -88,7 +88,7 @@ TEST(ProgressFile, AFailedSaveLeavesTheOldFileWholeAndTheGameRunning)
     s.Click("Check1");
     s.Click("\"Powrót\"");
     EXPECT_EQ(ReadFile(s.folder().File("config.cfg")), " 4 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n");
-    EXPECT_TRUE(s.game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(s.game.screen.MainMenuScreen->visible);
     std::filesystem::remove(s.folder().File("config.cfg.tmp"));
     s.Click("\"Opcje\"");
     s.Click("\"Powrót\"");

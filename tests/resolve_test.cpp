@@ -95,21 +95,21 @@ TEST_F(BoardPlay, SelectingDeselectingAndSwappingANeighbour)
     s.SetBoard(With(kStill, {{34, '5'}, {54, '5'}, {45, '5'}}));
     // The return question lies over rows 3..6 and lets presses through to the cells.
     s.Key(27);
-    ASSERT_TRUE(s.game.ui.ReturnPrompt->visible);
+    ASSERT_TRUE(s.game.screen.ReturnPrompt->visible);
     s.Press(45);
-    EXPECT_TRUE(s.game.ui.SelectionMarker->visible);
+    EXPECT_TRUE(s.game.screen.SelectionMarker->visible);
     EXPECT_EQ(s.Print("SelectionMarker.Left"), s.Print("Image1(45).Left"));
     s.Key(78);
     s.Press(45);
-    EXPECT_FALSE(s.game.ui.SelectionMarker->visible);
+    EXPECT_FALSE(s.game.screen.SelectionMarker->visible);
     EXPECT_EQ(s.game.SelectedCell, -1);
     s.Press(45);
     s.Press(47);  // not a neighbour: the selection stays
     EXPECT_EQ(s.game.SelectedCell, 45);
-    EXPECT_TRUE(s.game.ui.SelectionMarker->visible);
+    EXPECT_TRUE(s.game.screen.SelectionMarker->visible);
     s.Press(44);
     EXPECT_FALSE(s.game.InputReady);
-    EXPECT_FALSE(s.game.ui.SelectionMarker->visible);
+    EXPECT_FALSE(s.game.screen.SelectionMarker->visible);
     EXPECT_EQ(s.game.SelectedCell, 45) << "the old index stays; the marker tells whether a selection exists";
     const char* frames[] = {"palette 7", "palette 8", "palette 9", "palette 10", "palette 9", "palette 8", "palette 7"};
     for (const char* frame : frames) {
@@ -117,7 +117,7 @@ TEST_F(BoardPlay, SelectingDeselectingAndSwappingANeighbour)
         EXPECT_EQ(s.Print("Image1(44).Picture"), frame);
         EXPECT_EQ(s.Print("Image1(45).Picture"), frame);
         s.Press(11);  // ignored during the swap
-        EXPECT_FALSE(s.game.ui.SelectionMarker->visible);
+        EXPECT_FALSE(s.game.screen.SelectionMarker->visible);
     }
     s.Advance(30);  // the eighth tick exchanges the icons and finds the column at 34, 44, 54
     EXPECT_EQ(s.game.Board[45], 3);
@@ -141,9 +141,9 @@ TEST_F(BoardPlay, SelectingDeselectingAndSwappingANeighbour)
     EXPECT_EQ(s.game.Board[54], CLEARED);
     EXPECT_NE(s.game.Board[24], CLEARED);
     s.Press(12);
-    EXPECT_FALSE(s.game.ui.SelectionMarker->visible) << "presses are ignored during the fall";
+    EXPECT_FALSE(s.game.screen.SelectionMarker->visible) << "presses are ignored during the fall";
     s.Advance(2000);
-    EXPECT_TRUE(s.game.InputReady || s.game.ui.NoMovesLabel->visible);
+    EXPECT_TRUE(s.game.InputReady || s.game.screen.NoMovesLabel->visible);
 }
 
 TEST_F(BoardPlay, AnUnmatchedSwapStaysAndCostsAThirdOfTheMaximum)
@@ -165,18 +165,18 @@ TEST_F(BoardPlay, AnUnmatchedSwapStaysAndCostsAThirdOfTheMaximum)
     s.Run("sounds");
     EXPECT_EQ(s.TakeOutput(), "sounds: 11\n");
     // The still board has no move left: it is renewed, and the goal check waits for a later turn.
-    EXPECT_TRUE(s.game.ui.NoMovesLabel->visible);
+    EXPECT_TRUE(s.game.screen.NoMovesLabel->visible);
     EXPECT_FALSE(s.game.InputReady);
     s.Advance(1919);
     EXPECT_FALSE(s.game.InputReady);
-    EXPECT_TRUE(s.game.ui.NoMovesLabel->visible);
+    EXPECT_TRUE(s.game.screen.NoMovesLabel->visible);
     s.Advance(1);
     EXPECT_TRUE(s.game.InputReady) << "the last of 64 fill ticks comes 1920 ms after the renewal";
-    EXPECT_TRUE(s.game.ui.NoMovesLabel->visible);
+    EXPECT_TRUE(s.game.screen.NoMovesLabel->visible);
     s.Advance(79);
-    EXPECT_TRUE(s.game.ui.NoMovesLabel->visible);
+    EXPECT_TRUE(s.game.screen.NoMovesLabel->visible);
     s.Advance(1);
-    EXPECT_FALSE(s.game.ui.NoMovesLabel->visible) << "the label shows for 2 s";
+    EXPECT_FALSE(s.game.screen.NoMovesLabel->visible) << "the label shows for 2 s";
     EXPECT_FALSE(s.game.timers[8].Enabled());
     // Three penalties in all take the hero below zero.
     for (int turn = 0; turn < 2; ++turn) {
@@ -187,7 +187,7 @@ TEST_F(BoardPlay, AnUnmatchedSwapStaysAndCostsAThirdOfTheMaximum)
         s.Advance(2000);
     }
     EXPECT_EQ(s.game.Health, -1);
-    EXPECT_TRUE(s.game.ui.MissionFailedLabel->visible);
+    EXPECT_TRUE(s.game.screen.MissionFailedLabel->visible);
     EXPECT_FALSE(s.game.InputReady);
 }
 

@@ -13,8 +13,8 @@ using testing::Session;
 TEST(StartUp, ShowsTheMainMenuOverALockedBoardWithItsBorder)
 {
     Session s;
-    EXPECT_TRUE(s.game.ui.MenuLayer->visible);
-    EXPECT_TRUE(s.game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(s.game.screen.MenuLayer->visible);
+    EXPECT_TRUE(s.game.screen.MainMenuScreen->visible);
     for (const char* hidden : {"MissionMenuScreen", "BriefingScreen", "OptionsScreen", "LevelUpScreen",
                                "MissionCompleteScreen", "ReturnPrompt", "NoMovesLabel", "StageDoneLabel",
                                "MissionFailedLabel"})
@@ -51,8 +51,8 @@ TEST(StartUp, TheFirstHintIsNeverPageFourteen)
         ASSERT_GE(page, 1);
         ASSERT_LE(page, 13);
         ++seen[page];
-        ASSERT_EQ(s.game.ui.PageLabel->caption, std::to_string(page));
-        ASSERT_EQ(s.game.ui.HintLabel->caption, kTutorialTexts[static_cast<size_t>(page)]);
+        ASSERT_EQ(s.game.screen.PageLabel->caption, std::to_string(page));
+        ASSERT_EQ(s.game.screen.HintLabel->caption, kTutorialTexts[static_cast<size_t>(page)]);
     }
     for (int page = 1; page <= 13; ++page) EXPECT_GT(seen[page], 0) << page;
 }
@@ -61,17 +61,17 @@ TEST(ScreenFlow, MenusLeadToEachOtherAndExitEndsAtOnce)
 {
     Session s(7, " 3 \r\n 1 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n");
     s.Click("\"Gra\"");
-    EXPECT_FALSE(s.game.ui.MainMenuScreen->visible);
-    EXPECT_TRUE(s.game.ui.MissionMenuScreen->visible);
+    EXPECT_FALSE(s.game.screen.MainMenuScreen->visible);
+    EXPECT_TRUE(s.game.screen.MissionMenuScreen->visible);
     for (int i = 0; i < 10; ++i)
-        EXPECT_EQ(s.game.ui.MissionButtons[static_cast<size_t>(i)]->enabled, i < 3) << i;
+        EXPECT_EQ(s.game.screen.MissionButtons[static_cast<size_t>(i)]->enabled, i < 3) << i;
     // A disabled mission button takes no click.
     s.Click("Command4(3)");
-    EXPECT_TRUE(s.game.ui.MissionMenuScreen->visible);
+    EXPECT_TRUE(s.game.screen.MissionMenuScreen->visible);
     s.Click("\"Powrót\"");
-    EXPECT_TRUE(s.game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(s.game.screen.MainMenuScreen->visible);
     s.Click("\"Opcje\"");
-    EXPECT_TRUE(s.game.ui.OptionsScreen->visible);
+    EXPECT_TRUE(s.game.screen.OptionsScreen->visible);
     EXPECT_EQ(s.Print("Check1.Value"), "1");
     EXPECT_EQ(s.Print("HeroSummary.Caption"),
               "\"MOC:          1\\r\\nZRĘCZNOŚĆ:    0\\r\\nCELNOŚĆ:      0\\r\\nWYTRZYMAŁOŚĆ: 0\\r\\nINTELIGENCJA: 0\"");
@@ -80,7 +80,7 @@ TEST(ScreenFlow, MenusLeadToEachOtherAndExitEndsAtOnce)
     s.Click("\"Powrót\"");
     EXPECT_EQ(testing::ReadFile(s.folder().File("config.cfg")),
               " 3 \r\n 0 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n");
-    EXPECT_TRUE(s.game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(s.game.screen.MainMenuScreen->visible);
     EXPECT_FALSE(s.game.quitRequested);
     s.Click("\"Wyjście\"");
     EXPECT_TRUE(s.game.quitRequested);
@@ -91,7 +91,7 @@ TEST(ScreenFlow, BriefingTypesOneCharacterPerTickAndANewChoiceReplacesIt)
     Session s(7, " 2 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n 0 \r\n 0 \r\n");
     s.Click("\"Gra\"");
     s.Click("\"Misja 1\"");
-    EXPECT_TRUE(s.game.ui.BriefingScreen->visible);
+    EXPECT_TRUE(s.game.screen.BriefingScreen->visible);
     EXPECT_EQ(s.game.MaxHealth, 38);
     EXPECT_EQ(s.Print("Label12.Caption"), "\"\"");
     s.Advance(30);
@@ -100,7 +100,7 @@ TEST(ScreenFlow, BriefingTypesOneCharacterPerTickAndANewChoiceReplacesIt)
     EXPECT_EQ(s.Print("Label12.Caption"), "\"To będz\"") << "a Polish letter is one character";
     s.Click("\"<- Wróć do menu misji\"");
     s.Advance(100);
-    EXPECT_EQ(s.game.ui.BriefingLabel->caption.size(), std::string("To będzie misja s").size())
+    EXPECT_EQ(s.game.screen.BriefingLabel->caption.size(), std::string("To będzie misja s").size())
         << "typing goes on into the hidden label";
     s.Click("\"Misja 2\"");
     EXPECT_EQ(s.game.MaxHealth, 50);
@@ -109,7 +109,7 @@ TEST(ScreenFlow, BriefingTypesOneCharacterPerTickAndANewChoiceReplacesIt)
     int characters = 0;
     for (char c : text) characters += (static_cast<unsigned char>(c) & 0xC0) != 0x80;
     s.Advance(10 * characters);
-    EXPECT_EQ(s.game.ui.BriefingLabel->caption, text);
+    EXPECT_EQ(s.game.screen.BriefingLabel->caption, text);
     EXPECT_TRUE(s.game.timers[5].Enabled()) << "the tick after the last character stops the typewriter";
     s.Advance(10);
     EXPECT_FALSE(s.game.timers[5].Enabled());
@@ -136,23 +136,23 @@ TEST(Keys, EscapeTogglesThePromptNHidesItTLeavesTheMission)
     s.Click("\"Gra\"");
     s.Click("\"Misja 1\"");
     s.Click("\"Rozpocznij misję ->\"");
-    EXPECT_FALSE(s.game.ui.MenuLayer->visible);
+    EXPECT_FALSE(s.game.screen.MenuLayer->visible);
     s.Key(kEscapeKey);
-    EXPECT_TRUE(s.game.ui.ReturnPrompt->visible);
+    EXPECT_TRUE(s.game.screen.ReturnPrompt->visible);
     s.Key(kEscapeKey);
-    EXPECT_FALSE(s.game.ui.ReturnPrompt->visible);
+    EXPECT_FALSE(s.game.screen.ReturnPrompt->visible);
     s.Key(kEscapeKey);
     s.Key(kKeyN);
-    EXPECT_FALSE(s.game.ui.ReturnPrompt->visible);
+    EXPECT_FALSE(s.game.screen.ReturnPrompt->visible);
     s.Key(65);
-    EXPECT_FALSE(s.game.ui.ReturnPrompt->visible);
+    EXPECT_FALSE(s.game.screen.ReturnPrompt->visible);
     // T with the prompt hidden, in the middle of the fill with a slowed bomb clock.
     s.Advance(300);
     s.game.timers[6].SetInterval(200);
     s.game.timers[6].SetEnabled(true);
     s.Key(kKeyT);
-    EXPECT_TRUE(s.game.ui.MenuLayer->visible);
-    EXPECT_TRUE(s.game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(s.game.screen.MenuLayer->visible);
+    EXPECT_TRUE(s.game.screen.MainMenuScreen->visible);
     for (int timer = 1; timer <= 6; ++timer) EXPECT_FALSE(s.game.timers[timer].Enabled()) << timer;
     EXPECT_EQ(s.game.timers[6].Interval(), 100);
     EXPECT_TRUE(s.game.timers[16].Enabled());

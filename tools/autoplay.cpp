@@ -38,20 +38,20 @@ std::optional<std::pair<int16_t, int16_t>> FirstMatchingSwap(const BoardCells& b
 MissionResult PlayMission(Game& g, int mission, int64_t limit)
 {
     MissionResult result;
-    ClickAt(g, *g.ui.PlayButton);
-    ClickAt(g, *g.ui.MissionButtons[static_cast<size_t>(mission)]);
-    ClickAt(g, *g.ui.StartMission);
+    ClickAt(g, *g.screen.PlayButton);
+    ClickAt(g, *g.screen.MissionButtons[static_cast<size_t>(mission)]);
+    ClickAt(g, *g.screen.StartMission);
     const int64_t start = g.timers.Now();
     while (g.timers.Now() - start < limit) {
-        if (g.ui.MissionCompleteScreen->visible) {
+        if (g.screen.MissionCompleteScreen->visible) {
             result.won = true;
             break;
         }
-        if (g.ui.MenuLayer->visible && g.ui.MissionMenuScreen->visible) break;
-        if (g.InputReady && !g.ui.MenuLayer->visible) {
+        if (g.screen.MenuLayer->visible && g.screen.MissionMenuScreen->visible) break;
+        if (g.InputReady && !g.screen.MenuLayer->visible) {
             const auto swap = FirstMatchingSwap(g.Board).value_or(std::pair<int16_t, int16_t>{11, 12});
-            ClickAt(g, *g.ui.Cells[static_cast<size_t>(swap.first)]);
-            ClickAt(g, *g.ui.Cells[static_cast<size_t>(swap.second)]);
+            ClickAt(g, *g.screen.Cells[static_cast<size_t>(swap.first)]);
+            ClickAt(g, *g.screen.Cells[static_cast<size_t>(swap.second)]);
             // Presses that started no swap (say, a selection left from before) must not spin: let time pass.
             if (!g.InputReady) {
                 ++result.moves;

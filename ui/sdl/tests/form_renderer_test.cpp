@@ -72,24 +72,24 @@ TEST(FormRenderer, RedrawsAndRasterisesOnlyWhatChanged)
 
     const uint64_t signature = FrameSignature(game.form);
     EXPECT_EQ(FrameSignature(game.form), signature);
-    game.ui.StageDoneLabel->caption = "ukryty";
-    game.ui.StageDoneLabel->top += 15;
+    game.screen.StageDoneLabel->caption = "ukryty";
+    game.screen.StageDoneLabel->top += 15;
     EXPECT_EQ(FrameSignature(game.form), signature) << "a hidden label changed";
 
-    game.ui.StageDoneLabel->visible = true;
+    game.screen.StageDoneLabel->visible = true;
     const uint64_t shown = FrameSignature(game.form);
     EXPECT_NE(shown, signature);
-    game.ui.StageDoneLabel->visible = false;
-    game.ui.ReturnPrompt->visible = true;
+    game.screen.StageDoneLabel->visible = false;
+    game.screen.ReturnPrompt->visible = true;
     EXPECT_NE(FrameSignature(game.form), shown) << "showing one control is not showing another";
-    game.ui.ReturnPrompt->visible = false;
+    game.screen.ReturnPrompt->visible = false;
     ASSERT_EQ(FrameSignature(game.form), signature);
 
     game.form.pointer = ui::CursorPicture(ui::EnemyTurnCursor);
     EXPECT_NE(FrameSignature(game.form), signature);
     game.form.pointer = ui::CursorPicture(ui::NormalCursor);
 
-    game.ui.HealthLabel->caption = "123";
+    game.screen.HealthLabel->caption = "123";
     EXPECT_NE(FrameSignature(game.form), signature);
     camera.Capture(game.form);
     EXPECT_EQ(camera.Renderer().Rasterised(), rasterised + 1) << "one new line of text, nothing else";

@@ -63,8 +63,8 @@ TEST_F(GameWindowTest, PlaysFromTheMenuIntoAMissionAndBack)
     EXPECT_EQ(window.FramesPresented(), 1u);
 
     ASSERT_TRUE(Click(window, session, "Gra"));
-    EXPECT_TRUE(game.ui.MissionMenuScreen->visible);
-    EXPECT_FALSE(game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(game.screen.MissionMenuScreen->visible);
+    EXPECT_FALSE(game.screen.MainMenuScreen->visible);
     EXPECT_TRUE(window.Redraw());
 
     // A press with the right button is no click.
@@ -74,19 +74,19 @@ TEST_F(GameWindowTest, PlaysFromTheMenuIntoAMissionAndBack)
     window.Handle(right);
     right.type = SDL_MOUSEBUTTONUP;
     window.Handle(right);
-    EXPECT_TRUE(game.ui.MissionMenuScreen->visible);
+    EXPECT_TRUE(game.screen.MissionMenuScreen->visible);
 
     ASSERT_TRUE(Click(window, session, "Misja 1"));
-    EXPECT_TRUE(game.ui.BriefingScreen->visible);
+    EXPECT_TRUE(game.screen.BriefingScreen->visible);
     ASSERT_TRUE(Click(window, session, "Rozpocznij misję ->"));
-    EXPECT_FALSE(game.ui.MenuLayer->visible);
+    EXPECT_FALSE(game.screen.MenuLayer->visible);
 
     const uint64_t framesBefore = window.FramesPresented();
     Pass(3000);
     EXPECT_GE(game.timers.Now(), 3000);
     for (int row = 1; row <= 8; ++row)
         for (int column = 1; column <= 8; ++column) {
-            const ui::PictureRef gem = game.ui.Cells[static_cast<size_t>(row * 10 + column)]->picture;
+            const ui::PictureRef gem = game.screen.Cells[static_cast<size_t>(row * 10 + column)]->picture;
             EXPECT_EQ(gem.set, ui::PictureSet::Palette) << row << column;
             EXPECT_NE(gem.index, 10) << "cell " << row << column << " is still empty";
         }
@@ -94,13 +94,13 @@ TEST_F(GameWindowTest, PlaysFromTheMenuIntoAMissionAndBack)
 
     // Keys arrive as the game's codes: Escape asks, N declines, T leaves.
     window.Handle(Key(SDLK_ESCAPE));
-    EXPECT_TRUE(game.ui.ReturnPrompt->visible);
+    EXPECT_TRUE(game.screen.ReturnPrompt->visible);
     window.Handle(Key(SDLK_n));
-    EXPECT_FALSE(game.ui.ReturnPrompt->visible);
+    EXPECT_FALSE(game.screen.ReturnPrompt->visible);
     window.Handle(Key(SDLK_ESCAPE));
     window.Handle(Key(SDLK_t));
-    EXPECT_TRUE(game.ui.MenuLayer->visible);
-    EXPECT_TRUE(game.ui.MainMenuScreen->visible);
+    EXPECT_TRUE(game.screen.MenuLayer->visible);
+    EXPECT_TRUE(game.screen.MainMenuScreen->visible);
 
     EXPECT_FALSE(Click(window, session, "Wyjście")) << "the game asked to quit";
     EXPECT_TRUE(game.quitRequested);
