@@ -5,6 +5,7 @@
 #include "board/grid.h"
 #include "board/moves.h"
 #include "board/resolve.h"
+#include "shell/timer_numbers.h"
 #include "tests/session.h"
 
 namespace kr {
@@ -47,13 +48,13 @@ TEST(BoardFill, OneCellPerTickBottomRightFirstThenInput)
     s.Advance(54 * 30);
     EXPECT_EQ(s.Print("Image1(11).Picture"), "palette 10");
     EXPECT_FALSE(s.game.InputReady);
-    EXPECT_TRUE(s.game.timers[1].Enabled());
+    EXPECT_TRUE(s.game.timers[kFillTimer].Enabled());
     s.Advance(30);
     EXPECT_NE(s.Print("Image1(11).Picture"), "palette 10");
     EXPECT_EQ(s.game.FillCounter, 10);
-    EXPECT_FALSE(s.game.timers[1].Enabled());
+    EXPECT_FALSE(s.game.timers[kFillTimer].Enabled());
     EXPECT_TRUE(s.game.InputReady);
-    EXPECT_FALSE(s.game.timers[6].Enabled()) << "no bomb in the stage: the bomb clock stays off";
+    EXPECT_FALSE(s.game.timers[kBombClock].Enabled()) << "no bomb in the stage: the bomb clock stays off";
 }
 
 TEST(BoardFill, NoReadyMadeRunsAndTheBorderHoldsOverManySeeds)

@@ -6,6 +6,7 @@
 #include <string>
 
 #include "board/resolve.h"
+#include "shell/timer_numbers.h"
 #include "tests/session.h"
 
 namespace kr {
@@ -76,8 +77,8 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     s.Run("set TerminalWork 1");
     PlayRun(s, '4');
     const int64_t done = s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
-    EXPECT_EQ(s.Print("Timer7.Tag"), "\"10\"");
-    EXPECT_EQ(s.Print("Timer7.Interval"), "700");
+    EXPECT_EQ(s.game.timers[kStageDonePause].tag, "10");
+    EXPECT_EQ(s.game.timers[kStageDonePause].Interval(), 700);
     EXPECT_EQ(s.Print("DoneFrame(2).Visible"), "True");
     EXPECT_FALSE(s.game.InputReady);
     for (int tick = 1; tick <= 9; ++tick) {
@@ -92,7 +93,7 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     s.Advance(1);
     EXPECT_EQ(s.game.MissionStage, 1);
     EXPECT_EQ(Shown(s, "StageDoneLabel"), "False");
-    EXPECT_FALSE(s.game.timers[7].Enabled());
+    EXPECT_FALSE(s.game.timers[kStageDonePause].Enabled());
     EXPECT_EQ(Shown(s, "TerminalPanel"), "False");
     EXPECT_EQ(Shown(s, "EnemyPanel"), "True");
     EXPECT_EQ(s.Print("EnemyPanel.Top"), "0");
@@ -255,10 +256,10 @@ TEST(CampaignStageEnd, ADoorOpenedOnATurnThatLeavesNoMoveClosesTheStageOnTheNext
         EXPECT_FALSE(s.game.TerminalRequired);
         EXPECT_EQ(Shown(s, "DoneFrame(2)"), "True");
         EXPECT_EQ(Shown(s, "StageDoneLabel"), "False") << "the renewal replaces the goal check";
-        EXPECT_FALSE(s.game.timers[7].Enabled());
+        EXPECT_FALSE(s.game.timers[kStageDonePause].Enabled());
         s.Advance(64 * 30);
         ASSERT_TRUE(s.game.InputReady);
-        EXPECT_FALSE(s.game.timers[7].Enabled());
+        EXPECT_FALSE(s.game.timers[kStageDonePause].Enabled());
         PlayRun(s, '0');
         s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
         s.Advance(7000);
@@ -405,7 +406,7 @@ TEST(CampaignStages, EveryStagePlacesItsPanelsMandatoryFirst)
         Scuff(s);
         s.game.screen.MissionCompleteScreen->visible = false;
         s.game.screen.MenuLayer->visible = false;
-        s.game.timers[1].SetEnabled(false);
+        s.game.timers[kFillTimer].SetEnabled(false);
         s.Run("call SetUpStage " + std::to_string(m) + " " + std::to_string(stageCounts[m]));
         EXPECT_EQ(Shown(s, "MissionCompleteScreen"), "True");
         EXPECT_EQ(Shown(s, "MenuLayer"), "True");
@@ -413,7 +414,7 @@ TEST(CampaignStages, EveryStagePlacesItsPanelsMandatoryFirst)
         EXPECT_EQ(s.game.Health, s.game.MaxHealth);
         for (const char* panel : panels) EXPECT_EQ(Shown(s, panel), "False") << panel;
         EXPECT_FALSE(s.game.BombPresent || s.game.EnemyPresent || s.game.TerminalPresent);
-        EXPECT_FALSE(s.game.timers[1].Enabled()) << "no board for a won mission";
+        EXPECT_FALSE(s.game.timers[kFillTimer].Enabled()) << "no board for a won mission";
     }
 }
 

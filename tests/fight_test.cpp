@@ -10,112 +10,14 @@
 #include "board/moves.h"
 #include "board/resolve.h"
 #include "shell/timer_numbers.h"
+#include "tests/fight_helpers.h"
 #include "tests/session.h"
 
 namespace kr {
 namespace {
 
 using testing::Session;
-
-// Ten missions open, sound on, every attribute 0, tutorial off.
-const std::string kAllOpenWithSound = " 10 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n";
-
-// A quiet board: grey bullets, grenades and crosshairs in a pattern with no run, and one spare move in the
-// bottom row (swapping 83 and 84 lines up three red crosses) so the turn's move check never renews it.
-const char* const kQuiet[8] = {"02302302", "23023023", "30230230", "02302302",
-                               "23023023", "30230230", "02302302", "55053023"};
-
-// The quiet board with its top rows replaced; '.' keeps the quiet icon.
-std::string Board(std::vector<std::string> top)
-{
-    std::string rows;
-    for (size_t r = 0; r < 8; ++r) {
-        std::string row = kQuiet[r];
-        if (r < top.size())
-            for (size_t c = 0; c < std::min<size_t>(8, top[r].size()); ++c)
-                if (top[r][c] != '.') row[c] = top[r][c];
-        rows += row + "\n";
-    }
-    return rows;
-}
-
-// Row 1 reads a b 3 c: swapping cells 13 and 14 lines up a b c in cells 11..13.
-std::string RunOfThree(const char* abc) { return Board({std::string{abc[0], abc[1], '3', abc[2], '.', '.', '.', '.'}}); }
-
-// A board with no possible move where swapping 11 and 12 lines up nothing and still leaves none.
-const std::string kDeadBoard =
-    "14530122\n21510520\n00324415\n32105251\n33521234\n12010550\n04024401\n02513124\n";
-
-int64_t Now(const Session& s) { return s.game.timers.Now(); }
-
-// Sets a board after checking that it holds no run yet (and, unless told otherwise, a possible move).
-void Lay(Session& s, const std::string& rows, bool needsMove = true)
-{
-    s.SetBoard(rows);
-    ASSERT_TRUE(FindRuns(s.game.Board, s.game.GreenFlag).empty()) << rows;
-    ASSERT_EQ(HasPossibleMove(s.game.Board), needsMove) << rows;
-}
-
-void Swap(Session& s, int a, int b)
-{
-    s.Press(a);
-    s.Press(b);
-}
-
-// Lays RunOfThree(abc) and makes the move that lines it up.
-void StartRun(Session& s, const char* abc)
-{
-    Lay(s, RunOfThree(abc));
-    Swap(s, 13, 14);
-}
-
-// The same, on to the swap's last step: the moment the run takes effect, before its icons fall.
-void PlayRun(Session& s, const char* abc)
-{
-    StartRun(s, abc);
-    s.Advance(240);
-}
-
-// Sets game variables, each "Name Value".
-void Set(Session& s, std::initializer_list<std::string> assignments)
-{
-    for (const std::string& assignment : assignments) ASSERT_EQ(s.Run("set " + assignment), 0) << assignment;
-}
-
-// Until the board is the player's again: nothing animating, no attack, input released.
-void Settle(Session& s)
-{
-    s.AdvanceUntil([&] { return s.game.InputReady && NothingRunning(s.game.timers); });
-}
-
-// The channels played since the last call.
-std::vector<int> Sounds(Session& s)
-{
-    s.TakeOutput();
-    s.Run("sounds");
-    std::istringstream words(s.TakeOutput().substr(std::string("sounds:").size()));
-    std::vector<int> played;
-    for (int channel = 0; words >> channel;) played.push_back(channel);
-    return played;
-}
-
-bool Played(const std::vector<int>& sounds, int channel)
-{
-    return std::find(sounds.begin(), sounds.end(), channel) != sounds.end();
-}
-
-bool IsShot(const std::vector<int>& sounds) { return sounds == std::vector<int>{0} || sounds == std::vector<int>{1}; }
-
-// Starts mission `mission` from the menu and moves on to `stage` the way the stage-done pause does.
-void Enter(Session& s, int mission, int stage)
-{
-    s.StartMission(mission);
-    if (stage == 0) return;
-    s.Run("set MissionStage " + std::to_string(stage));
-    s.Run("call SetUpStage " + std::to_string(mission) + " " + std::to_string(stage));
-    s.Advance(64 * 30);
-    ASSERT_TRUE(s.game.InputReady);
-}
+using namespace testing;
 
 // --- Shots -------------------------------------------------------------------------------------------------
 
@@ -131,7 +33,7 @@ TEST(FightShots, DamageGrowsWithLengthGreenTipsAccuracyAndDeadlyBulletsAndTheBar
     EXPECT_EQ(s.game.EnemyHealth, 36);
     EXPECT_EQ(s.Print("EnemyHealthBar.Width"), "1309.5");
     EXPECT_EQ(s.Print("HitMarker.Visible"), "False");
-    EXPECT_FALSE(s.game.timers[12].Enabled());
+    EXPECT_FALSE(s.game.timers[kMarkerTimer].Enabled());
     EXPECT_TRUE(IsShot(Sounds(s)));
     // The hero's frame lights up and the (hidden) number starts its rise from the health label.
     EXPECT_EQ(s.Print("HeroShotFrame.Visible"), "True");
@@ -143,9 +45,9 @@ TEST(FightShots, DamageGrowsWithLengthGreenTipsAccuracyAndDeadlyBulletsAndTheBar
     s.Advance(100);  // 5th rise tick
     EXPECT_EQ(s.Print("HeroShotFrame.Visible"), "False");
     s.Advance(300);
-    EXPECT_TRUE(s.game.timers[10].Enabled());
+    EXPECT_TRUE(s.game.timers[kRiseTimer].Enabled());
     s.Advance(100);  // 9th rise tick
-    EXPECT_FALSE(s.game.timers[10].Enabled());
+    EXPECT_FALSE(s.game.timers[kRiseTimer].Enabled());
     EXPECT_EQ(s.Print("DamageLabel.Top"), "25");
     Settle(s);  // the enemy's (missed) shot
 
@@ -177,7 +79,7 @@ TEST(FightShots, DamageGrowsWithLengthGreenTipsAccuracyAndDeadlyBulletsAndTheBar
     EXPECT_EQ(s.Print("HitMarker.Visible"), "True");
     s.Advance(1);
     EXPECT_EQ(s.Print("HitMarker.Visible"), "False");
-    EXPECT_FALSE(s.game.timers[12].Enabled());
+    EXPECT_FALSE(s.game.timers[kMarkerTimer].Enabled());
     Settle(s);
     EXPECT_EQ(s.game.DeadlyBulletsTurns, 2) << "one move used up";
     EXPECT_EQ(s.game.EnemyHealth, 11) << "no stray cascade hit the enemy";
@@ -199,7 +101,7 @@ TEST(FightShots, AnOverkillShotFinishesTheEnemyAndItNeverShootsBack)
     EXPECT_EQ(s.Print("HitMarker.Visible"), "False");
 
     s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
-    EXPECT_FALSE(s.game.timers[11].Enabled()) << "a dead enemy takes no turn";
+    EXPECT_FALSE(s.game.timers[kAttackTimer].Enabled()) << "a dead enemy takes no turn";
     EXPECT_EQ(s.game.Health, 30);
     EXPECT_EQ(s.game.DeadlyBulletsTurns, 0);
     s.Advance(7000);  // the robot was the last goal of "Misja 1"
@@ -214,7 +116,7 @@ TEST(FightShots, BulletsWithNoEnemyOnlyMakeAnImpactSound)
     PlayRun(s, "1g1");
     EXPECT_EQ(Sounds(s), std::vector<int>{3});
     EXPECT_EQ(s.Print("HeroShotFrame.Visible"), "False");
-    EXPECT_FALSE(s.game.timers[10].Enabled());
+    EXPECT_FALSE(s.game.timers[kRiseTimer].Enabled());
     EXPECT_EQ(s.game.TerminalWork, 20);
     EXPECT_EQ(s.game.Resources[1], 0);
 }
@@ -242,7 +144,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         EXPECT_EQ(s.game.Resources[4], 1);
         Settle(s);
         EXPECT_FALSE(s.game.screen.StageDoneLabel->visible) << "the terminal is still required";
-        EXPECT_TRUE(s.game.timers[6].Enabled());
+        EXPECT_TRUE(s.game.timers[kBombClock].Enabled());
 
         // Next, the required terminal.
         PlayRun(s, "444");
@@ -265,7 +167,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         EXPECT_EQ(s.game.BombWork, 100);
         EXPECT_TRUE(s.game.BombPresent);
         const int16_t ticks = s.game.BombTicks;
-        EXPECT_FALSE(s.game.timers[6].Enabled()) << "the stage's end stops the optional bomb's clock";
+        EXPECT_FALSE(s.game.timers[kBombClock].Enabled()) << "the stage's end stops the optional bomb's clock";
         s.Advance(3000);
         EXPECT_EQ(s.game.BombTicks, ticks);
     }
@@ -282,7 +184,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         Settle(s);
         const int16_t ticks = s.game.BombTicks;
         s.Advance(1000);
-        EXPECT_TRUE(s.game.timers[6].Enabled());
+        EXPECT_TRUE(s.game.timers[kBombClock].Enabled());
         EXPECT_EQ(s.game.BombTicks, ticks - 10);
         EXPECT_FALSE(s.game.screen.StageDoneLabel->visible);
     }
@@ -323,7 +225,7 @@ TEST(FightEnemyTurn, AMandatoryEnemyBlinksFourTimesShootsAtOneSecondAndHandsTheB
     Enter(s, 0, 1);  // the robot: attack 2
     s.Run("set EnemyHitChance 101");
     StartRun(s, "000");
-    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
+    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
     EXPECT_EQ(s.Print("Pointer"), "EnemyTurnCursor");
     EXPECT_FALSE(s.game.InputReady);
 
@@ -349,7 +251,7 @@ TEST(FightEnemyTurn, AMandatoryEnemyBlinksFourTimesShootsAtOneSecondAndHandsTheB
     EXPECT_EQ(s.Print("RequiredFrame(1).Visible"), "True");
     EXPECT_EQ(s.Print("Pointer"), "NormalCursor");
     EXPECT_TRUE(s.game.InputReady);
-    EXPECT_FALSE(s.game.timers[11].Enabled());
+    EXPECT_FALSE(s.game.timers[kAttackTimer].Enabled());
     s.Advance(899);
     EXPECT_EQ(s.Print("DamageLabel.Visible"), "True");
     s.Advance(1);
@@ -359,7 +261,7 @@ TEST(FightEnemyTurn, AMandatoryEnemyBlinksFourTimesShootsAtOneSecondAndHandsTheB
     Settle(s);
     s.Run("set EnemyHitChance 0");
     StartRun(s, "000");
-    s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
+    s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
     s.Advance(999);
     Sounds(s);
     s.Advance(1);
@@ -377,13 +279,13 @@ TEST(FightEnemyTurn, AnOptionalEnemyBlinksWithoutAFrameAndAStageEndCutsItsShotOf
     s.Run("set EnemyHitChance 0");
     EXPECT_EQ(s.Print("RequiredFrame(1).Visible"), "False");
     StartRun(s, "000");
-    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
+    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
     const char* const frame[5] = {"True", "False", "True", "False", "False"};
     for (int tick = 0; tick < 5; ++tick) {
         s.Advance(static_cast<int>(turnEnd + 200 * (tick + 1) - Now(s)));
         EXPECT_EQ(s.Print("RequiredFrame(1).Visible"), frame[tick]) << "tick " << tick + 1;
     }
-    EXPECT_FALSE(s.game.timers[11].Enabled());
+    EXPECT_FALSE(s.game.timers[kAttackTimer].Enabled());
     s.Advance(1000);
     EXPECT_EQ(s.Print("RequiredFrame(1).Visible"), "False");
 
@@ -395,7 +297,7 @@ TEST(FightEnemyTurn, AnOptionalEnemyBlinksWithoutAFrameAndAStageEndCutsItsShotOf
     Sounds(s);
     Swap(s, 13, 14);
     s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
-    EXPECT_FALSE(s.game.timers[11].Enabled());
+    EXPECT_FALSE(s.game.timers[kAttackTimer].Enabled());
     EXPECT_EQ(s.Print("Pointer"), "NormalCursor");
     EXPECT_FALSE(s.game.InputReady);
     s.Advance(2000);
@@ -419,7 +321,7 @@ TEST(FightEnemyTurn, HitDamageSpreadsTwentyPercentAroundTheAttack)
             s.Run("set Health 1000");
             s.Run("call StartEnemyAttack");
             s.Advance(1000);
-            ASSERT_FALSE(s.game.timers[11].Enabled());
+            ASSERT_FALSE(s.game.timers[kAttackTimer].Enabled());
             const int damage = 1000 - s.game.Health;
             ASSERT_EQ(s.Print("DamageLabel.Caption"), "\"" + std::to_string(damage) + "\"");
             ++hits;
@@ -444,11 +346,11 @@ TEST(FightBomb, TheClockStartsWhenTheBoardHasFilledAndTheBarFollowsTheTicks)
     s.StartMission(2);
     s.Run("call SetUpStage 2 2");  // "Misja 3", stage 2: the bomb, 1500 ticks
     s.Advance(64 * 30 - 1);
-    EXPECT_FALSE(s.game.timers[6].Enabled()) << "nothing counts while the board fills";
+    EXPECT_FALSE(s.game.timers[kBombClock].Enabled()) << "nothing counts while the board fills";
     EXPECT_EQ(s.game.BombTicks, 1500);
     s.Advance(1);
-    EXPECT_TRUE(s.game.timers[6].Enabled());
-    EXPECT_EQ(s.game.timers[6].Interval(), 100);
+    EXPECT_TRUE(s.game.timers[kBombClock].Enabled());
+    EXPECT_EQ(s.game.timers[kBombClock].Interval(), 100);
     s.Advance(99);
     EXPECT_EQ(s.game.BombTicks, 1500);
     s.Advance(1);
@@ -462,9 +364,9 @@ TEST(FightBomb, TheClockStartsWhenTheBoardHasFilledAndTheBarFollowsTheTicks)
     s.Run("call SetUpStage 2 2");
     s.Advance(64 * 30 - 1);
     EXPECT_EQ(s.game.BombTicks, 1500);
-    EXPECT_FALSE(s.game.timers[6].Enabled());
+    EXPECT_FALSE(s.game.timers[kBombClock].Enabled());
     s.Advance(1);
-    EXPECT_TRUE(s.game.timers[6].Enabled());
+    EXPECT_TRUE(s.game.timers[kBombClock].Enabled());
 }
 
 TEST(FightBomb, AnExpiredBombFailsTheMissionAndFreezesTheBoardMidSwap)
@@ -480,11 +382,11 @@ TEST(FightBomb, AnExpiredBombFailsTheMissionAndFreezesTheBoardMidSwap)
     EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "False");
     s.Advance(100);  // the bomb goes off halfway through the swap
     EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "True");
-    EXPECT_EQ(s.Print("Timer9.Tag"), "\"10\"");
-    EXPECT_TRUE(s.game.timers[9].Enabled());
+    EXPECT_EQ(s.game.timers[kFailureTimer].tag, "10");
+    EXPECT_TRUE(s.game.timers[kFailureTimer].Enabled());
     EXPECT_EQ(Sounds(s), (std::vector<int>{8, 9}));
     for (int timer = 1; timer <= 6; ++timer) EXPECT_FALSE(s.game.timers[timer].Enabled()) << "Timer" << timer;
-    EXPECT_EQ(s.game.timers[6].Interval(), 100);
+    EXPECT_EQ(s.game.timers[kBombClock].Interval(), 100);
     EXPECT_FALSE(s.game.InputReady);
     EXPECT_EQ(s.game.Board[13], 3) << "the swap never finished";
     EXPECT_EQ(s.game.BombWork, 20);
@@ -495,7 +397,7 @@ TEST(FightBomb, AnExpiredBombFailsTheMissionAndFreezesTheBoardMidSwap)
     EXPECT_EQ(s.Print("MenuLayer.Visible"), "True");
     EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "True");
     EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "False");
-    EXPECT_FALSE(s.game.timers[9].Enabled());
+    EXPECT_FALSE(s.game.timers[kFailureTimer].Enabled());
     s.Advance(10000);
     EXPECT_TRUE(Sounds(s).empty()) << "no second failure";
 }
@@ -506,10 +408,10 @@ TEST(FightBomb, AShotThatKillsAfterTheBombWentOffStartsNoSecondFailure)
     Enter(s, 4, 2);  // "Misja 5", stage 2: an enemy and a bomb
     Set(s, {"EnemyHitChance 101", "Health 1"});
     StartRun(s, "000");
-    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
+    const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
     s.Run("set BombTicks 3");
     Sounds(s);
-    const int64_t boom = s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
+    const int64_t boom = s.AdvanceUntil([&] { return s.game.timers[kFailureTimer].Enabled(); });
     EXPECT_LT(boom, turnEnd + 1000);
     EXPECT_EQ(Sounds(s), (std::vector<int>{8, 9}));
     s.Advance(static_cast<int>(turnEnd + 1000 - Now(s)));
@@ -536,11 +438,11 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         s.Run("set EnemyHitChance 0");
         Lay(s, kDeadBoard, false);
         Swap(s, 11, 12);
-        const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
+        const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
         EXPECT_EQ(s.game.Health, 20) << "the swap lined up nothing";
         EXPECT_EQ(s.Print("NoMovesLabel.Visible"), "True");
         s.Advance(1000);
-        EXPECT_FALSE(s.game.timers[11].Enabled());
+        EXPECT_FALSE(s.game.timers[kAttackTimer].Enabled());
         EXPECT_FALSE(s.game.InputReady) << "the new board is still filling";
         s.Advance(static_cast<int>(turnEnd + 64 * 30 - 1 - Now(s)));
         EXPECT_FALSE(s.game.InputReady);
@@ -555,14 +457,14 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         Lay(s, kDeadBoard, false);
         Sounds(s);
         Swap(s, 11, 12);
-        const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
+        const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
         EXPECT_EQ(s.game.Health, 1);
         s.Advance(1000);
         EXPECT_EQ(s.game.Health, -1);
         EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "True");
         EXPECT_FALSE(s.game.InputReady);
         s.Advance(static_cast<int>(turnEnd + 64 * 30 - Now(s)));
-        EXPECT_FALSE(s.game.timers[1].Enabled()) << "the new board has filled";
+        EXPECT_FALSE(s.game.timers[kFillTimer].Enabled()) << "the new board has filled";
         EXPECT_FALSE(s.game.InputReady) << "a dead hero gets no board";
         s.Press(45);
         EXPECT_EQ(s.Print("SelectionMarker.Visible"), "False");
@@ -582,15 +484,15 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         Lay(s, kDeadBoard, false);
         Sounds(s);
         Swap(s, 11, 12);
-        const int64_t death = s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
+        const int64_t death = s.AdvanceUntil([&] { return s.game.timers[kFailureTimer].Enabled(); });
         EXPECT_EQ(s.game.Health, 0);
-        EXPECT_FALSE(s.game.timers[6].Enabled());
+        EXPECT_FALSE(s.game.timers[kBombClock].Enabled());
         EXPECT_EQ(Sounds(s), (std::vector<int>{11, 8}));
         const int16_t ticks = s.game.BombTicks;
         s.Advance(64 * 30);
-        EXPECT_FALSE(s.game.timers[1].Enabled());
+        EXPECT_FALSE(s.game.timers[kFillTimer].Enabled());
         EXPECT_FALSE(s.game.InputReady);
-        EXPECT_FALSE(s.game.timers[6].Enabled()) << "a new board under the failure starts no clock";
+        EXPECT_FALSE(s.game.timers[kBombClock].Enabled()) << "a new board under the failure starts no clock";
         s.Advance(1000);
         EXPECT_EQ(s.game.BombTicks, ticks);
         s.Advance(static_cast<int>(death + 7000 - Now(s)));
@@ -610,14 +512,14 @@ TEST(FightEndings, AHeroWhoDiesHasLostEvenWhenNoMandatoryGoalIsLeft)
     Lay(s, Board({}));
     Sounds(s);
     Swap(s, 11, 12);
-    const int64_t death = s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
-    EXPECT_FALSE(s.game.timers[7].Enabled());
+    const int64_t death = s.AdvanceUntil([&] { return s.game.timers[kFailureTimer].Enabled(); });
+    EXPECT_FALSE(s.game.timers[kStageDonePause].Enabled());
     EXPECT_EQ(s.Print("StageDoneLabel.Visible"), "False");
     EXPECT_EQ(Sounds(s), (std::vector<int>{11, 8}));
     s.Advance(static_cast<int>(death + 7000 - Now(s)));
     EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "True");
     EXPECT_EQ(s.game.MissionStage, 0);
-    EXPECT_FALSE(s.game.timers[1].Enabled()) << "no next stage is set up";
+    EXPECT_FALSE(s.game.timers[kFillTimer].Enabled()) << "no next stage is set up";
 }
 
 // Back on the main menu, and nothing of the mission left behind carries on under it.
@@ -657,7 +559,7 @@ TEST(FightEndings, KeyTLeavesDuringTheStagePauseTheFailureOrTheEnemyTurn)
         s.Run("set Health 1");
         Lay(s, Board({}));  // swapping 11 and 12 lines nothing up
         Swap(s, 11, 12);
-        s.AdvanceUntil([&] { return s.game.timers[9].Enabled(); });
+        s.AdvanceUntil([&] { return s.game.timers[kFailureTimer].Enabled(); });
         s.Advance(1000);
         s.Key(84);
         ExpectLeftForGood(s, 0, -12);
@@ -667,7 +569,7 @@ TEST(FightEndings, KeyTLeavesDuringTheStagePauseTheFailureOrTheEnemyTurn)
         Enter(s, 1, 0);
         s.Run("set EnemyHitChance 101");
         StartRun(s, "000");
-        s.AdvanceUntil([&] { return s.game.timers[11].Enabled(); });
+        s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
         s.Advance(500);
         s.Key(84);
         ExpectLeftForGood(s, 0, 40);

@@ -1,7 +1,11 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <cstdlib>
 #include <fstream>
 #include <sstream>
+#include <string>
+#include <vector>
 
 #include "tests/session.h"
 #include "tools/script.h"
@@ -11,29 +15,40 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// Every tests/replays/NAME.script is run headless (with NAME.cfg as the starting progress file when there is
-// one) and its whole printed output must equal NAME.expected.
-TEST(Replays, EveryScriptPrintsItsExpectedOutput)
+// The replays in tests/replays: each NAME.script runs headless (with NAME.cfg as the starting progress file when
+// there is one), and its whole printed output must equal NAME.expected. With KRUSZARKA_REWRITE_REPLAYS=1 in the
+// environment the expected files are written anew instead, for a change that is meant to alter them.
+std::vector<std::string> ReplayNames()
 {
-    const fs::path folder = KRUSZARKA_REPLAYS;
-    int replays = 0;
-    for (const fs::directory_entry& entry : fs::directory_iterator(folder)) {
-        if (entry.path().extension() != ".script") continue;
-        ++replays;
-        const fs::path base = fs::path(entry.path()).replace_extension();
-        testing::TempFolder work;
-        const fs::path progress = work.File("config.cfg");
-        if (fs::exists(fs::path(base).replace_extension(".cfg")))
-            fs::copy_file(fs::path(base).replace_extension(".cfg"), progress);
-        std::ostringstream out;
-        script::ScriptRunner runner(out, 1, {}, progress);
-        std::ifstream in(entry.path());
-        const int code = runner.Run(in);
-        EXPECT_EQ(code, 0) << entry.path() << "\n" << out.str();
-        EXPECT_EQ(out.str(), testing::ReadFile(fs::path(base).replace_extension(".expected"))) << entry.path();
-    }
-    EXPECT_GE(replays, 2);
+    std::vector<std::string> names;
+    for (const fs::directory_entry& entry : fs::directory_iterator(KRUSZARKA_REPLAYS))
+        if (entry.path().extension() == ".script") names.push_back(entry.path().stem().string());
+    std::sort(names.begin(), names.end());
+    return names;
 }
+
+class Replay : public ::testing::TestWithParam<std::string> {};
+
+TEST_P(Replay, PrintsItsExpectedOutput)
+{
+    const fs::path base = fs::path(KRUSZARKA_REPLAYS) / GetParam();
+    testing::TempFolder work;
+    const fs::path progress = work.File("config.cfg");
+    if (fs::exists(fs::path(base).replace_extension(".cfg")))
+        fs::copy_file(fs::path(base).replace_extension(".cfg"), progress);
+    std::ostringstream out;
+    script::ScriptRunner runner(out, 1, {}, progress);
+    std::ifstream in(fs::path(base).replace_extension(".script"));
+    const int code = runner.Run(in);
+    EXPECT_EQ(code, 0) << out.str();
+    const fs::path expected = fs::path(base).replace_extension(".expected");
+    const char* rewrite = std::getenv("KRUSZARKA_REWRITE_REPLAYS");
+    if (rewrite && std::string(rewrite) == "1") testing::WriteFile(expected, out.str());
+    EXPECT_EQ(out.str(), testing::ReadFile(expected));
+}
+
+INSTANTIATE_TEST_SUITE_P(Replays, Replay, ::testing::ValuesIn(ReplayNames()),
+                         [](const ::testing::TestParamInfo<std::string>& replay) { return replay.param; });
 
 // The language itself: exit codes and the shapes of what it prints.
 TEST(Replays, TheScenarioLanguageReportsFailuresAndBadLines)

@@ -3,6 +3,7 @@
 #include "board/grid.h"
 #include "board/moves.h"
 #include "board/resolve.h"
+#include "shell/timer_numbers.h"
 #include "tests/session.h"
 
 namespace kr {
@@ -132,10 +133,10 @@ TEST_F(BoardPlay, SelectingDeselectingAndSwappingANeighbour)
     s.Press(12);
     s.Advance(45);
     EXPECT_EQ(s.Print("Image1(34).Picture"), "palette 10");
-    EXPECT_FALSE(s.game.timers[4].Enabled());
+    EXPECT_FALSE(s.game.timers[kFallTimer].Enabled());
     s.Advance(45);
-    EXPECT_FALSE(s.game.timers[3].Enabled());
-    EXPECT_TRUE(s.game.timers[4].Enabled());
+    EXPECT_FALSE(s.game.timers[kBlastTimer].Enabled());
+    EXPECT_TRUE(s.game.timers[kFallTimer].Enabled());
     // Three gaps in one column: three fall ticks, then one that resolves.
     s.Advance(75);
     EXPECT_EQ(s.game.Board[54], CLEARED);
@@ -177,7 +178,7 @@ TEST_F(BoardPlay, AnUnmatchedSwapStaysAndCostsAThirdOfTheMaximum)
     EXPECT_TRUE(s.game.screen.NoMovesLabel->visible);
     s.Advance(1);
     EXPECT_FALSE(s.game.screen.NoMovesLabel->visible) << "the label shows for 2 s";
-    EXPECT_FALSE(s.game.timers[8].Enabled());
+    EXPECT_FALSE(s.game.timers[kNoMovesTimer].Enabled());
     // Three penalties in all take the hero below zero.
     for (int turn = 0; turn < 2; ++turn) {
         s.SetBoard(kStill);

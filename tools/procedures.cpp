@@ -7,12 +7,17 @@
 #include "board/moves.h"
 #include "board/resolve.h"
 #include "board/swap.h"
+#include "board/targets.h"
 #include "combat/effects.h"
 #include "combat/enemy.h"
 #include "combat/outcome.h"
 #include "combat/stage.h"
+#include "hero/bullet_time.h"
+#include "hero/descriptions.h"
 #include "hero/levelup.h"
 #include "hero/panel.h"
+#include "hero/skills.h"
+#include "hero/targeting.h"
 #include "shell/briefing.h"
 #include "shell/game.h"
 #include "shell/progress.h"
@@ -32,6 +37,7 @@ constexpr ArgumentRule kStage{[](int16_t s) { return s >= 0 && s <= 4; }, "a sta
 constexpr ArgumentRule kPage{[](int16_t p) { return p >= 1 && p <= 14; }, "a page 1..14"};
 constexpr ArgumentRule kAttribute{[](int16_t a) { return a >= 0 && a <= 10; }, "an attribute 0..10"};
 constexpr ArgumentRule kAmount{[](int16_t a) { return a >= -1000 && a <= 1000; }, "an amount -1000..1000"};
+constexpr ArgumentRule kSkill{[](int16_t s) { return s >= 0 && s < kSkillCount; }, "a skill 0..6"};
 constexpr ArgumentRule kGreenTips{[](int16_t n) { return n >= 0 && n <= 8; }, "green tips 0..8"};
 
 Procedure Checked(Procedure procedure, std::vector<ArgumentRule> rules)
@@ -114,6 +120,16 @@ const std::map<std::string, Procedure, std::less<>>& Procedures()
         {"DoEngineering", Checked(Action1Ref(DoEngineering), {kAmount})},
         {"HealHero", Checked(Action1Ref(HealHero), {kAmount})},
         {"StartEnemyAttack", Action(StartEnemyAttack)},
+        {"UseSkill", Checked(Action1Ref(UseSkill), {kSkill})},
+        {"BoardPressed", Checked(Action1(BoardPressed), {kPlayableCell})},
+        {"ThrowGrenade", Checked(Action1(ThrowGrenade), {kPlayableCell})},
+        {"BlastKind", Checked(Action1(BlastKind), {kPlayableCell})},
+        {"StartBulletTime", Action(StartBulletTime)},
+        {"EndBulletTime", Action(EndBulletTime)},
+        {"ShowBoardPointer", Action(ShowBoardPointer)},
+        {"ShowSkillDescription", Checked(Action1Ref(ShowSkillDescription), {kSkill})},
+        {"ShowHeroAttributes", Action(ShowHeroAttributes)},
+        {"ClearDescription", Action(ClearDescription)},
         {"MaxHealthFor", {2,
                           [](Game&, const Args& a) -> std::optional<std::string> {
                               return std::to_string(MaxHealthFor(a[0], a[1]));

@@ -102,6 +102,7 @@ const std::map<std::string, Variable, std::less<>>& Variables()
         {"SwapUnmatched", Scalar(&Game::SwapUnmatched)},
         {"TeleportPending", Scalar(&Game::TeleportPending)},
         {"BlastPending", Scalar(&Game::BlastPending)},
+        {"GrenadePending", Scalar(&Game::GrenadePending)},
         {"Strength", Scalar(&Game::Strength)},
         {"Intelligence", Scalar(&Game::Intelligence)},
         {"Dexterity", Scalar(&Game::Dexterity)},
