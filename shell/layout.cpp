@@ -1,3 +1,4 @@
+#include <stdexcept>
 #include <string>
 
 #include "shell/screen.h"
@@ -121,9 +122,6 @@ public:
         return c;
     }
 
-    void Alias(const char* role, Control& c) { form_.Alias(role, c); }
-    void Alias(const char* role, int index, Control& c) { form_.Alias(Indexed(role, index), c); }
-
 private:
     ui::Form& form_;
 };
@@ -160,9 +158,6 @@ void BuildHeroPanel(Builder& b, Screen& s)
                              Align::Centre);
     s.DamageLabel->wordWrap = false;
     s.DamageLabel->visible = false;
-    b.Alias("HealthBar", *s.HealthFill);
-    b.Alias("DamageLabel", *s.DamageLabel);
-    b.Alias("HeroShotFrame", *s.HeroShotFrame);
 }
 
 void BuildSkillPanel(Builder& b, Screen& s)
@@ -195,8 +190,6 @@ void BuildSkillPanel(Builder& b, Screen& s)
             }
         s.SkillHighlight[sk] = &b.Outline(&frame, Indexed("Shape2", k), 0, 120, 1455, 495, kGreen, 2);
         s.SkillHighlight[sk]->visible = false;
-        b.Alias("SkillHighlight", k, *s.SkillHighlight[sk]);
-        b.Alias("SkillFrame", k, frame);
     }
 }
 
@@ -211,26 +204,20 @@ void BuildBoard(Builder& b, Screen& s)
     s.Cells[0]->picture = ui::Palette(14);
     s.SelectionMarker = &b.Outline(nullptr, "Shape1", 1680, 0, 495, 495, kGreen, 2);
     s.SelectionMarker->visible = false;
-    b.Alias("SelectionMarker", *s.SelectionMarker);
 }
 
 void BuildGoalPanels(Builder& b, Screen& s)
 {
     constexpr const char* kPictures[3] = {"Image8", "Image9", "Image10"};
-    constexpr const char* kPanelRoles[3] = {"BombPanel", "EnemyPanel", "TerminalPanel"};
     for (int i = 0; i < 3; ++i) {
         const size_t si = static_cast<size_t>(i);
         Control& panel = b.Panel(nullptr, Indexed("Frame4", i), 6840, static_cast<float>(2220 * i), 1695, 2175);
         s.GoalPanel[si] = &panel;
-        b.Alias("GoalPanel", i, panel);
-        b.Alias(kPanelRoles[i], panel);
         s.GoalPicture[si] = &b.Picture(&panel, kPictures[i], 480, 240, 735, 735);
         s.RequiredFrame[si] = &b.Outline(&panel, Indexed("Shape4", i), 480, 240, 735, 735, kGoalYellow, 3);
         s.DoneFrame[si] = &b.Outline(&panel, Indexed("Shape5", i), 480, 240, 735, 735, Colour{65, 79, 252}, 5);
         s.RequiredFrame[si]->visible = false;
         s.DoneFrame[si]->visible = false;
-        b.Alias("RequiredFrame", i, *s.RequiredFrame[si]);
-        b.Alias("DoneFrame", i, *s.DoneFrame[si]);
     }
     s.GoalPicture[0]->picture = {ui::PictureSet::Object, 0};
     s.GoalPicture[1]->picture = {ui::PictureSet::Portrait, 0};
@@ -254,14 +241,13 @@ void BuildGoalPanels(Builder& b, Screen& s)
         float left;
         float width;
         Colour fill;
-        const char* role;
         Control* Screen::*member;
     };
     const BarPlace kBars[4] = {
-        {0, 120, 735, kWorkOrange, "BombWorkBar", &Screen::BombWorkBar},
-        {0, 840, 735, Colour{9, 116, 234}, "BombTimeBar", &Screen::BombTimeBar},
-        {1, 120, 1455, kBarRed, "EnemyHealthBar", &Screen::EnemyHealthBar},
-        {2, 120, 1455, kWorkOrange, "TerminalWorkBar", &Screen::TerminalWorkBar},
+        {0, 120, 735, kWorkOrange, &Screen::BombWorkBar},
+        {0, 840, 735, Colour{9, 116, 234}, &Screen::BombTimeBar},
+        {1, 120, 1455, kBarRed, &Screen::EnemyHealthBar},
+        {2, 120, 1455, kWorkOrange, &Screen::TerminalWorkBar},
     };
     for (int k = 0; k < 4; ++k) {
         const BarPlace& bar = kBars[k];
@@ -270,20 +256,16 @@ void BuildGoalPanels(Builder& b, Screen& s)
         Control& outline = b.Outline(panel, Indexed("Shape3", 2 * k + 1), bar.left, 1680, bar.width, 255, kBlack, 1);
         s.*(bar.member) = &fill;
         s.BarOutlines[static_cast<size_t>(k)] = &outline;
-        b.Alias(bar.role, fill);
     }
     s.HitMarker = &b.Solid(s.GoalPanel[1], "Shape6", 120, 1710, 15, 200, Colour{192, 192, 192});
     s.HitMarker->visible = false;
-    b.Alias("HitMarker", *s.HitMarker);
 }
 
 void BuildTutorialArea(Builder& b, Screen& s)
 {
     s.TutorialArea = &b.Panel(nullptr, "Frame3", 1920, 5040, 4815, 1575);
     s.HoverLabel = &b.Label(s.TutorialArea, "Label1", 120, 240, 4575, 1215, "", kGreen, Mono(8.25f));
-    b.Alias("HoverLabel", *s.HoverLabel);
     s.TutorialPanel = &b.Panel(s.TutorialArea, "Frame15", 120, 120, 4575, 1335);
-    b.Alias("TutorialPanel", *s.TutorialPanel);
     Control* panel = s.TutorialPanel;
     s.HintLabel = &b.Label(panel, "Label16", 120, 280, 4335, 735, "", kBlack, Sans(8.25f));
     s.PageLabel = &b.Label(panel, "Label17", 3840, 120, 375, 255, "", kBlack, Sans(8.25f, true), Align::Right);
@@ -299,23 +281,16 @@ void BuildTutorialArea(Builder& b, Screen& s)
     s.CloseHints->bordered = true;
     b.Outline(panel, "Shape9(0)", 600, 960, 1095, 255, kBlack, 2);
     b.Outline(panel, "Shape9(1)", 2640, 960, 1095, 255, kBlack, 2);
-    b.Alias("HintLabel", *s.HintLabel);
-    b.Alias("PageLabel", *s.PageLabel);
 }
 
 void BuildMessages(Builder& b, Screen& s)
 {
     s.BulletTimeBar = &b.Solid(nullptr, "Shape11", 2400, 0, 3855, 135, kGoalYellow);
     s.BulletTimeBar->visible = false;
-    b.Alias("BulletTimeBar", *s.BulletTimeBar);
     s.StageDoneLabel = &b.Message("Label2", 2040, 1680, 4815, 1695, "Zadanie wykonane!", kGreen, 36);
     s.NoMovesLabel = &b.Message("Label5", 2160, 1440, 4815, 2775, "Brak możliwych ruchów", Colour{255, 128, 0}, 36);
     s.MissionFailedLabel = &b.Message("Label7", 2040, 1680, 4815, 2775, "Misja nieudana!", Colour{247, 40, 102}, 36);
     s.ReturnPrompt = &b.Message("Label3", 2040, 1920, 4815, 975, "Wrócić do menu? (t/n)", kYellow, 20.25f);
-    b.Alias("StageDoneLabel", *s.StageDoneLabel);
-    b.Alias("NoMovesLabel", *s.NoMovesLabel);
-    b.Alias("MissionFailedLabel", *s.MissionFailedLabel);
-    b.Alias("ReturnPrompt", *s.ReturnPrompt);
 }
 
 void BuildMainAndMissionMenus(Builder& b, Screen& s)
@@ -344,7 +319,6 @@ void BuildMainAndMissionMenus(Builder& b, Screen& s)
                                Mono(8.25f));
     s.BriefingBack = &b.Button(s.BriefingScreen, "Command8", 240, 3615, 2415, 350, "<- Wróć do menu misji", kGrey,
                                Mono(8.25f));
-    b.Alias("BriefingLabel", *s.BriefingLabel);
 }
 
 void BuildOptions(Builder& b, Screen& s)
@@ -360,7 +334,6 @@ void BuildOptions(Builder& b, Screen& s)
     s.HeroSummary = &b.Label(s.OptionsScreen, "Label14", 360, 960, 1935, 1215, "", kYellow, Mono(8.25f));
     s.HeroSummary->wordWrap = false;
     b.Picture(s.OptionsScreen, "Image13", 720, 360, 735, 495, {ui::PictureSet::Hero, 0});
-    b.Alias("HeroSummary", *s.HeroSummary);
 }
 
 void BuildLevelUp(Builder& b, Screen& s)
@@ -387,7 +360,6 @@ void BuildLevelUp(Builder& b, Screen& s)
                                    255, Colour{0, 192, 0});
             pip.shape = ui::ShapeKind::Circle;
             s.AttributePips[static_cast<size_t>(k)] = &pip;
-            b.Alias("AttributePips", k, pip);
         }
     }
     s.AttributeDescription = &b.Label(s.LevelUpScreen, "Label11", 120, 2160, 3375, 975, kAttributeDescriptions[4],
@@ -411,7 +383,6 @@ void BuildPictureStores(Builder& b, Screen& s)
     for (int i = 0; i < 15; ++i) {
         s.GemPalette[static_cast<size_t>(i)] = &b.Picture(nullptr, Indexed("Image5", i), 0, 0, 480, 480, ui::Palette(i));
         s.GemPalette[static_cast<size_t>(i)]->visible = false;
-        b.Alias("GemPalette", i, *s.GemPalette[static_cast<size_t>(i)]);
     }
     for (int i = 0; i < 8; ++i) {
         Control& c = b.Picture(nullptr, Indexed("Image11", i), 0, 0, 735, 735, {ui::PictureSet::Portrait, int16_t(i)});
@@ -423,6 +394,21 @@ void BuildPictureStores(Builder& b, Screen& s)
         c.visible = false;
         s.ObjectPictures[static_cast<size_t>(i)] = &c;
     }
+}
+
+// Gives every member of the screen its own name as a role, and refuses a screen with a member left unset.
+void NameRoles(ui::Form& form, const Screen& s)
+{
+    const auto name = [&form](const std::string& role, Control* control) {
+        if (!control) throw std::logic_error("BuildScreen: " + role + " was never built");
+        form.Alias(role, *control);
+    };
+#define KRUSZARKA_ONE(member) name(#member, s.member);
+#define KRUSZARKA_MANY(member, count) \
+    for (size_t i = 0; i < (count); ++i) name(Indexed(#member, static_cast<int>(i)), s.member[i]);
+    KRUSZARKA_SCREEN_CONTROLS(KRUSZARKA_ONE, KRUSZARKA_MANY)
+#undef KRUSZARKA_ONE
+#undef KRUSZARKA_MANY
 }
 
 }  // namespace
@@ -443,21 +429,11 @@ void BuildScreen(ui::Form& form, Screen& s)
     BuildMessages(b, s);
 
     s.MenuLayer = &b.Panel(nullptr, "Frame5", 0, 0, 8655, 6735, kDarkGrey);
-    b.Alias("MenuLayer", *s.MenuLayer);
     BuildMainAndMissionMenus(b, s);
     BuildOptions(b, s);
     BuildLevelUp(b, s);
     BuildMissionComplete(b, s);
-
-    b.Alias("MainMenuScreen", *s.MainMenuScreen);
-    b.Alias("MissionMenuScreen", *s.MissionMenuScreen);
-    b.Alias("BriefingScreen", *s.BriefingScreen);
-    b.Alias("OptionsScreen", *s.OptionsScreen);
-    b.Alias("LevelUpScreen", *s.LevelUpScreen);
-    b.Alias("MissionCompleteScreen", *s.MissionCompleteScreen);
-    b.Alias("HeroPanel", *s.HeroPanel);
-    b.Alias("SkillPanel", *s.SkillPanel);
-    b.Alias("TutorialArea", *s.TutorialArea);
+    NameRoles(form, s);
 }
 
 }  // namespace kr

@@ -70,8 +70,8 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     s.Click("\"Rozpocznij misję ->\"");
     s.Advance(64 * 30);
     ASSERT_TRUE(s.game.InputReady);
-    EXPECT_EQ(Shown(s, "TerminalPanel"), "True");
-    EXPECT_EQ(Shown(s, "EnemyPanel"), "False");
+    EXPECT_EQ(Shown(s, "GoalPanel(2)"), "True");
+    EXPECT_EQ(Shown(s, "GoalPanel(1)"), "False");
 
     // The door: opened by a real move, then "Zadanie wykonane!" blinks ten times 700 ms apart.
     s.Run("set TerminalWork 1");
@@ -94,9 +94,9 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     EXPECT_EQ(s.game.MissionStage, 1);
     EXPECT_EQ(Shown(s, "StageDoneLabel"), "False");
     EXPECT_FALSE(s.game.timers[kStageDonePause].Enabled());
-    EXPECT_EQ(Shown(s, "TerminalPanel"), "False");
-    EXPECT_EQ(Shown(s, "EnemyPanel"), "True");
-    EXPECT_EQ(s.Print("EnemyPanel.Top"), "0");
+    EXPECT_EQ(Shown(s, "GoalPanel(2)"), "False");
+    EXPECT_EQ(Shown(s, "GoalPanel(1)"), "True");
+    EXPECT_EQ(s.Print("GoalPanel(1).Top"), "0");
     EXPECT_EQ(s.Print("Image9.Picture"), "portrait 0");
     EXPECT_EQ(Shown(s, "RequiredFrame(1)"), "True");
     EXPECT_EQ(s.game.EnemyHealth, 25);
@@ -151,8 +151,8 @@ TEST(CampaignMission1, ANewPlayerWinsMission1AndSpendsTheFirstPoint)
     s.Click("\"Misja 2\"");
     s.Click("\"Rozpocznij misję ->\"");
     EXPECT_EQ(s.game.MaxHealth, 40);
-    EXPECT_EQ(Shown(s, "SkillFrame(1)"), "True");
-    EXPECT_EQ(Shown(s, "SkillFrame(2)"), "False");
+    EXPECT_EQ(Shown(s, "SkillFrames(1)"), "True");
+    EXPECT_EQ(Shown(s, "SkillFrames(2)"), "False");
 }
 
 // --- Level-ups ---------------------------------------------------------------------------------------------
@@ -339,7 +339,7 @@ TEST(CampaignStages, EveryStagePlacesItsPanelsMandatoryFirst)
 {
     Session s(36, Progress({3, 0, 0, 0, 0, 0, 0, 0}));
     s.StartMission(0);
-    const char* const panels[3] = {"BombPanel", "EnemyPanel", "TerminalPanel"};
+    const char* const panels[3] = {"GoalPanel(0)", "GoalPanel(1)", "GoalPanel(2)"};
     for (const StageRow& row : kStages) {
         SCOPED_TRACE("mission " + std::to_string(row.mission) + " stage " + std::to_string(row.stage));
         Scuff(s);
@@ -389,7 +389,7 @@ TEST(CampaignStages, EveryStagePlacesItsPanelsMandatoryFirst)
         EXPECT_FALSE(g.InputReady);
         EXPECT_EQ(Shown(s, "MenuLayer"), "False");
         for (int k = 0; k < 7; ++k)
-            EXPECT_EQ(Shown(s, "SkillFrame(" + std::to_string(k) + ")"), k < 3 ? "True" : "False") << k;
+            EXPECT_EQ(Shown(s, "SkillFrames(" + std::to_string(k) + ")"), k < 3 ? "True" : "False") << k;
     }
 
     // "Misja 9" keeps whatever the door's panel showed last, even the bomb drawn on "Misja 5"'s door.
