@@ -14,18 +14,6 @@
 namespace kr {
 namespace {
 
-// The grenade's area in the order it is hit: the 3 x 3 square, then one cell beyond the middle of each side,
-// left out where it would wrap into another row or leave the grid.
-std::vector<int> GrenadeArea(int c)
-{
-    std::vector<int> area{c, c - 1, c + 1, c - 10, c - 11, c - 9, c + 9, c + 10, c + 11};
-    if (ColumnOf(c) != 1) area.push_back(c - 2);
-    if (ColumnOf(c) != 8) area.push_back(c + 2);
-    if (c >= 20) area.push_back(c - 20);
-    if (c < 80) area.push_back(c + 20);
-    return area;
-}
-
 // The ring is never part of the field: a grenade near the edge hits it, and it is put back.
 void RepairBorder(Game& g)
 {
@@ -37,6 +25,16 @@ void RepairBorder(Game& g)
 }
 
 }  // namespace
+
+std::vector<int> GrenadeArea(int c)
+{
+    std::vector<int> area{c, c - 1, c + 1, c - 10, c - 11, c - 9, c + 9, c + 10, c + 11};
+    if (ColumnOf(c) != 1) area.push_back(c - 2);
+    if (ColumnOf(c) != 8) area.push_back(c + 2);
+    if (c >= 20) area.push_back(c - 20);
+    if (c < 80) area.push_back(c + 20);
+    return area;
+}
 
 void BoardPressed(Game& g, int16_t cell)
 {

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "board/resolve.h"
+#include "board/targets.h"
 #include "hero/bullet_time.h"
 #include "hero/skills.h"
 #include "shell/game.h"
@@ -82,15 +83,11 @@ bool Use(Game& g, int skill, MissionResult& result)
     return true;
 }
 
-int BrownBulletsAround(const Game& g, int c)
+int BrownBulletsAround(const Game& g, int cell)
 {
-    std::vector<int> area{c, c - 1, c + 1, c - 10, c - 11, c - 9, c + 9, c + 10, c + 11};
-    if (ColumnOf(c) != 1) area.push_back(c - 2);
-    if (ColumnOf(c) != 8) area.push_back(c + 2);
-    if (c >= 20) area.push_back(c - 20);
-    if (c < 80) area.push_back(c + 20);
+    const std::vector<int> area = GrenadeArea(cell);
     return static_cast<int>(std::count_if(area.begin(), area.end(),
-                                          [&](int cell) { return g.Board[static_cast<size_t>(cell)] == kBrownBullet; }));
+                                          [&](int hit) { return g.Board[static_cast<size_t>(hit)] == kBrownBullet; }));
 }
 
 // Whether the icon at `cell` stands in a line of three equal icons, across or down.
