@@ -1,5 +1,7 @@
 #include "shell/events.h"
 
+#include <functional>
+
 #include "board/fill.h"
 #include "board/moves.h"
 #include "board/resolve.h"
@@ -63,34 +65,34 @@ void ConnectBoard(Game& g)
         g.screen.Cells[cell]->onMouseDown = [&g, cell] { BoardPressed(g, static_cast<int16_t>(cell)); };
 }
 
-// A skill is used by a press on its frame, its icon or one of its price slots, or by a click on a "5x".
-void ConnectSkills(Game& g)
+// Every control that stands for a skill: its frame, its icon and its six price slots.
+void ForEachSkillControl(Screen& s, const std::function<void(ui::Control&, int16_t)>& each)
 {
-    Screen& s = g.screen;
-    auto use = [&g](int16_t skill) { return [&g, skill] { UseSkill(g, skill); }; };
     for (size_t k = 0; k < s.SkillFrames.size(); ++k) {
-        const auto skill = static_cast<int16_t>(k);
-        s.SkillFrames[k]->onMouseDown = use(skill);
-        s.SkillIcons[k]->onMouseDown = use(skill);
+        each(*s.SkillFrames[k], static_cast<int16_t>(k));
+        each(*s.SkillIcons[k], static_cast<int16_t>(k));
     }
     for (size_t slot = 0; slot < s.CostIcons.size(); ++slot)
-        s.CostIcons[slot]->onMouseDown = use(SkillOfCostSlot(static_cast<int>(slot)));
-    for (ui::Control* label : s.FiveTimesLabels) label->onClick = use(kDeadlyBullets);
+        each(*s.CostIcons[slot], SkillOfCostSlot(static_cast<int>(slot)));
+}
+
+// A skill is used by a press on any of its controls, or by a click on a "5x".
+void ConnectSkills(Game& g)
+{
+    ForEachSkillControl(g.screen, [&g](ui::Control& control, int16_t skill) {
+        control.onMouseDown = [&g, skill] { UseSkill(g, skill); };
+    });
+    for (ui::Control* label : g.screen.FiveTimesLabels) label->onClick = [&g] { UseSkill(g, kDeadlyBullets); };
 }
 
 // Moving over a skill or the hero describes it; moving over the board or a background clears the text.
 void ConnectDescriptions(Game& g)
 {
     Screen& s = g.screen;
-    auto describe = [&g](int16_t skill) { return [&g, skill] { ShowSkillDescription(g, skill); }; };
-    for (size_t k = 0; k < s.SkillFrames.size(); ++k) {
-        const auto skill = static_cast<int16_t>(k);
-        s.SkillFrames[k]->onMouseMove = describe(skill);
-        s.SkillIcons[k]->onMouseMove = describe(skill);
-    }
-    for (size_t slot = 0; slot < s.CostIcons.size(); ++slot)
-        s.CostIcons[slot]->onMouseMove = describe(SkillOfCostSlot(static_cast<int>(slot)));
-    for (ui::Control* label : s.FiveTimesLabels) label->onMouseMove = describe(kDeadlyBullets);
+    ForEachSkillControl(s, [&g](ui::Control& control, int16_t skill) {
+        control.onMouseMove = [&g, skill] { ShowSkillDescription(g, skill); };
+    });
+    for (ui::Control* label : s.FiveTimesLabels) label->onMouseMove = [&g] { ShowSkillDescription(g, kDeadlyBullets); };
 
     const auto hero = [&g] { ShowHeroAttributes(g); };
     s.HeroPanel->onMouseMove = hero;
