@@ -489,6 +489,26 @@ TEST(BulletTime, SlowsTheBombForFifteenSecondsWithTheSoundAtTheStartAndTheHalf)
     EXPECT_FALSE(s.game.timers[kBulletTimeDuration].Enabled());
 }
 
+TEST(BulletTime, AnExplodingBombEndsItWithBothSounds)
+{
+    Session s(5, kEverySkill);
+    Enter(s, 2, 2);
+    Afford(s, kBulletTime);
+    Use(s, kBulletTime);
+    Set(s, {"BombTicks 1"});
+    Sounds(s);
+    s.Advance(199);
+    EXPECT_FALSE(s.game.timers[kFailureTimer].Enabled());
+    s.Advance(1);
+    EXPECT_TRUE(s.game.timers[kFailureTimer].Enabled());
+    EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "True");
+    EXPECT_EQ(Sounds(s), (std::vector<int>{8, 9}));
+    EXPECT_FALSE(s.game.timers[kBulletTimeDuration].Enabled());
+    EXPECT_FALSE(s.game.timers[kBulletTimeBar].Enabled());
+    EXPECT_EQ(s.Print("BulletTimeBar.Visible"), "False");
+    EXPECT_EQ(s.game.timers[kBombClock].Interval(), 100);
+}
+
 TEST(BulletTime, TheEnemyAnswersEverySecondMoveBeginningWithTheFirst)
 {
     Session s(5, kEverySkill);
