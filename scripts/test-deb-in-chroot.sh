@@ -20,7 +20,10 @@ cleanup() {
   rm -rf --one-file-system "$root"
 }
 trap cleanup EXIT
+failures=0
 fail() { echo "FAIL: $*" >&2; exit 1; }
+# A failed check of the installed game is reported and the other checks still run.
+flaw() { echo "FAIL: $*" >&2; failures=$((failures + 1)); }
 in_root() { chroot "$root" env -i PATH=/usr/sbin:/usr/bin:/sbin:/bin HOME=/home/player "$@"; }
 
 echo "== debootstrap bookworm (minbase) into $root"
@@ -43,13 +46,14 @@ echo "== the menu entry's command, with --check-data"
 desktop="$(ls "$root"/usr/share/applications/*.desktop)"
 exec_line="$(sed -n 's/^Exec=//p' "$desktop")"
 # shellcheck disable=SC2086 # the entry's command is words
-as_player sh -c "cd / && $exec_line --check-data" || fail "the installed game lacks the files named above"
-[ -d "$root/home/player/.local/share/kruszarka" ] || fail "no per-user folder"
+as_player sh -c "cd / && $exec_line --check-data" || flaw "the installed game lacks the files named above"
+[ -d "$root/home/player/.local/share/kruszarka" ] || flaw "no per-user folder"
 
 echo "== the game itself, from the menu, for three seconds"
 status=0
 as_player sh -c "cd / && timeout 3 $exec_line" > "$root/tmp/game.out" 2>&1 || status=$?
 cat "$root/tmp/game.out"
-[ "$status" = 124 ] || fail "the game stopped by itself (exit $status)"
-if grep -q 'cannot draw\|no sound' "$root/tmp/game.out"; then fail "the game reported missing files"; fi
+[ "$status" = 124 ] || flaw "the game stopped by itself (exit $status)"
+if grep -q 'cannot draw\|no sound' "$root/tmp/game.out"; then flaw "the game reported missing files"; fi
+[ "$failures" = 0 ] || fail "$failures checks of the installed game failed"
 echo "== the installed game starts and finds its pictures, sounds and fonts"
