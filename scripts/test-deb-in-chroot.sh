@@ -15,6 +15,8 @@ mirror="${KRUSZARKA_MIRROR:-http://deb.debian.org/debian}"
 cache="${KRUSZARKA_DEBOOTSTRAP_CACHE:-/var/tmp/kruszarka-debootstrap-cache}"
 mkdir -p "$cache"
 root="$(mktemp -d /var/tmp/kruszarka-chroot.XXXXXX)"
+# mktemp's folder is root's alone; the system inside is run by other users too.
+chmod 755 "$root"
 cleanup() {
   umount "$root/proc" 2> /dev/null || true
   rm -rf --one-file-system "$root"

@@ -21,8 +21,6 @@ public:
     std::filesystem::path Resolve(std::string_view relative) const;
     std::filesystem::path Picture(std::string_view stem) const;
 
-    const std::vector<std::filesystem::path>& Folders() const { return folders_; }
-
 private:
     std::vector<std::filesystem::path> folders_;
 };
