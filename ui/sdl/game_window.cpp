@@ -24,6 +24,13 @@ constexpr double kLongestCatchUp = 250;
 
 }  // namespace
 
+int FittingScale(int usableWidth, int usableHeight)
+{
+    int scale = kLargestScale;
+    while (scale > 1 && (scale * kWidth > usableWidth || scale * kHeight + kDecoration > usableHeight)) --scale;
+    return scale;
+}
+
 int ChooseScale()
 {
     if (const char* forced = SDL_getenv("KRUSZARKA_SCALE")) {
@@ -32,9 +39,7 @@ int ChooseScale()
     }
     SDL_Rect usable{};
     if (SDL_GetDisplayUsableBounds(0, &usable) != 0) return 1;
-    int scale = kLargestScale;
-    while (scale > 1 && (scale * kWidth > usable.w || scale * kHeight + kDecoration > usable.h)) --scale;
-    return scale;
+    return FittingScale(usable.w, usable.h);
 }
 
 GameWindow::GameWindow(Game& game, const Assets& assets, int scale)

@@ -12,7 +12,9 @@
 
 namespace kr::sdl {
 
-// The largest whole scale, 1 to 4, whose window fits the desktop's usable area; KRUSZARKA_SCALE forces one.
+// The largest whole scale, 1 to 4, whose window and its frame fit a usable area of this many pixels.
+int FittingScale(int usableWidth, int usableHeight);
+// The fitting scale of the desktop's usable area; KRUSZARKA_SCALE forces one.
 int ChooseScale();
 
 // The game's one window: it draws the form, turns SDL's events into the form's input and drives the
