@@ -1,5 +1,6 @@
 #include "ui/picture.h"
 
+#include <algorithm>
 #include <array>
 
 namespace kr::ui {
@@ -82,6 +83,17 @@ std::string FileStem(PictureRef p)
     case PictureSet::None: break;
     }
     return {};
+}
+
+std::vector<PictureRef> AllPictures()
+{
+    std::vector<PictureRef> pictures;
+    for (const Store& store : kStores)
+        for (int index = 0; index < std::max(store.count, 1); ++index) {
+            const PictureRef picture{store.set, static_cast<int16_t>(index)};
+            if (SizeOf(picture)) pictures.push_back(picture);
+        }
+    return pictures;
 }
 
 std::string Describe(PictureRef p)

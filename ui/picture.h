@@ -3,6 +3,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace kr::ui {
 
@@ -48,6 +49,9 @@ std::optional<PixelSize> SizeOf(PictureRef picture);
 
 // The asset file stem under assets/pictures, empty for "no picture".
 std::string FileStem(PictureRef picture);
+
+// Every picture the game can show, each once.
+std::vector<PictureRef> AllPictures();
 
 // How scripts and tests name a picture: "palette 7", "portrait 3", "hero", "NormalCursor".
 std::string Describe(PictureRef picture);

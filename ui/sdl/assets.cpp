@@ -6,25 +6,29 @@
 
 namespace kr::sdl {
 
-Assets::Assets(std::filesystem::path folder) : folder_(std::move(folder)) {}
+Assets::Assets(std::vector<std::filesystem::path> folders) : folders_(std::move(folders)) {}
+
+Assets::Assets(std::filesystem::path folder) : folders_{std::move(folder)} {}
 
 Assets Assets::BesideExecutable()
 {
     char* base = SDL_GetBasePath();
-    if (!base) return Assets(std::filesystem::current_path());
-    Assets assets{std::filesystem::path(base)};
+    // Without the executable's folder only the configured install is left to try.
+    if (!base) return Assets(std::filesystem::path(KRUSZARKA_INSTALL_DATA));
+    const std::filesystem::path executable(base);
     SDL_free(base);
-    return assets;
+    return Assets({executable, (executable / KRUSZARKA_DATA_FROM_BIN).lexically_normal()});
 }
 
 std::filesystem::path Assets::Resolve(std::string_view relative) const
 {
-    std::error_code error;
-    const std::filesystem::path beside = folder_ / relative;
-    if (std::filesystem::exists(beside, error)) return beside;
-    const std::filesystem::path here = std::filesystem::path(relative);
-    if (std::filesystem::exists(here, error)) return here;
-    return beside;
+    if (folders_.empty()) return {};
+    for (const std::filesystem::path& folder : folders_) {
+        std::error_code error;
+        const std::filesystem::path file = folder / relative;
+        if (std::filesystem::is_regular_file(file, error)) return file;
+    }
+    return folders_.front() / relative;
 }
 
 std::filesystem::path Assets::Picture(std::string_view stem) const

@@ -16,21 +16,30 @@ constexpr int kWidth = 576;
 constexpr int kHeight = 447;
 // Room for the title bar and frame a window manager adds.
 constexpr int kDecoration = 64;
+// 4x already fills a 4K screen.
+constexpr int kLargestScale = 4;
 // The most game time one wake-up may run. Beyond it (a modal box, a suspended laptop) the game resumes
 // where it stopped instead of replaying every missed tick of its animations in one burst.
 constexpr double kLongestCatchUp = 250;
 
 }  // namespace
 
+int FittingScale(int usableWidth, int usableHeight)
+{
+    int scale = kLargestScale;
+    while (scale > 1 && (scale * kWidth > usableWidth || scale * kHeight + kDecoration > usableHeight)) --scale;
+    return scale;
+}
+
 int ChooseScale()
 {
     if (const char* forced = SDL_getenv("KRUSZARKA_SCALE")) {
         const int scale = std::atoi(forced);
-        if (scale == 1 || scale == 2) return scale;
+        if (scale >= 1 && scale <= kLargestScale) return scale;
     }
     SDL_Rect usable{};
     if (SDL_GetDisplayUsableBounds(0, &usable) != 0) return 1;
-    return 2 * kWidth <= usable.w && 2 * kHeight + kDecoration <= usable.h ? 2 : 1;
+    return FittingScale(usable.w, usable.h);
 }
 
 GameWindow::GameWindow(Game& game, const Assets& assets, int scale)

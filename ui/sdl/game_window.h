@@ -12,8 +12,9 @@
 
 namespace kr::sdl {
 
-// The largest whole scale, 1 or 2, whose window fits the desktop's usable area. 3x is left out: the
-// monospace advance stops being a whole multiple there.
+// The largest whole scale, 1 to 4, whose window and its frame fit a usable area of this many pixels.
+int FittingScale(int usableWidth, int usableHeight);
+// The fitting scale of the desktop's usable area; KRUSZARKA_SCALE forces one.
 int ChooseScale();
 
 // The game's one window: it draws the form, turns SDL's events into the form's input and drives the

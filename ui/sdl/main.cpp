@@ -1,16 +1,27 @@
 #define SDL_MAIN_HANDLED
 #include <chrono>
+#include <cstdlib>
 #include <exception>
+#include <iostream>
+#include <stdexcept>
+#include <string_view>
 
 #include "shell/game.h"
 #include "shell/startup.h"
 #include "ui/sdl/assets.h"
+#include "ui/sdl/data_check.h"
 #include "ui/sdl/game_window.h"
 #include "ui/sdl/handles.h"
 #include "ui/sdl/message_boxes.h"
 #include "ui/sdl/mixer_sound.h"
+#include "ui/user_folder.h"
 
 namespace {
+
+constexpr const char* kUsage =
+    "usage: kruszarka [--user-folder] [--check-data]\n"
+    "  --user-folder  keep progress in $XDG_DATA_HOME/kruszarka (~/.local/share/kruszarka), not here\n"
+    "  --check-data   load every picture, sound and font, name what is missing, and exit\n";
 
 uint32_t SeedFromClock()
 {
@@ -18,19 +29,45 @@ uint32_t SeedFromClock()
     return static_cast<uint32_t>(static_cast<uint64_t>(ticks) ^ (static_cast<uint64_t>(ticks) >> 32));
 }
 
+// The desktop menu starts the game in the user's own folder, so its progress does not land wherever the
+// menu happened to start it.
+void EnterUserFolder()
+{
+    const auto folder = kr::ui::UserFolder(std::getenv("XDG_DATA_HOME"), std::getenv("HOME"));
+    if (!folder) throw std::runtime_error("Nie wiem, gdzie zapisać postępy: brak zmiennej HOME.");
+    if (const std::string why = kr::ui::EnterFolder(*folder); !why.empty())
+        throw std::runtime_error("Nie mogę otworzyć folderu na postępy gry: " + why);
+}
+
 }  // namespace
 
-int main()
+int main(int argc, char** argv)
 {
     using namespace kr;
     SDL_SetMainReady();
+    bool userFolder = false;
+    bool checkData = false;
+    for (int i = 1; i < argc; ++i) {
+        const std::string_view option = argv[i];
+        if (option == "--user-folder") userFolder = true;
+        else if (option == "--check-data") checkData = true;
+        else {
+            std::cerr << kUsage;
+            return 2;
+        }
+    }
     try {
+        if (userFolder) EnterUserFolder();
         const sdl::Subsystem video(SDL_INIT_VIDEO);
         const sdl::Assets assets = sdl::Assets::BesideExecutable();
         sdl::MixerSound sound(assets);
         sdl::SdlMessageBoxes messages;
         Game game{Host{messages, sound}};
         sdl::GameWindow gameWindow(game, assets, sdl::ChooseScale());
+        if (checkData) {
+            gameWindow.Redraw();
+            return sdl::CheckGameData(assets, gameWindow.Scale(), std::cout) ? 0 : 1;
+        }
         messages.SetParent(gameWindow.Handle());
         StartUp(game, SeedFromClock());
         if (game.quitRequested) return 0;
@@ -40,7 +77,7 @@ int main()
         gameWindow.Run();
         return 0;
     } catch (const std::exception& error) {
-        // Anything thrown here is a bug in the game: say so once, and stop. The window is gone by now.
+        // Anything thrown here is a bug in the game or a folder it cannot use: say so once, and stop.
         sdl::ShowFatalError(error.what());
         return 1;
     }
