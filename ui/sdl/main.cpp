@@ -27,7 +27,7 @@ int main()
     try {
         const sdl::Subsystem video(SDL_INIT_VIDEO);
         const sdl::Assets assets = sdl::Assets::BesideExecutable();
-        sdl::MixerSound sound(assets);
+        sdl::MixerSound sound(assets, sdl::GameWindow::RealClock());
         sdl::SdlMessageBoxes messages;
         Game game{Host{messages, sound}};
         sdl::GameWindow gameWindow(game, assets, sdl::ChooseScale());
@@ -37,6 +37,7 @@ int main()
         gameWindow.Show();
         gameWindow.Redraw();
         sound.Start();
+        gameWindow.SetChore([&sound] { return sound.CloseWhenQuiet(); });
         gameWindow.Run();
         return 0;
     } catch (const std::exception& error) {
