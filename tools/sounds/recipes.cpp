@@ -71,8 +71,10 @@ std::vector<float> Impact()
     Oscillator body;
     track.Add(0, 0.32, [&](double t) { return SineOf(body.Step(Glide(t, 0.15, 150, 55))) * Percussive(t, 0.001, 0.07); });
     Noise noise(41);
-    LowPass thud;
-    track.Add(0, 0.2, [&](double t) { return thud.Step(noise.Next(), 1800) * Percussive(t, 0.001, 0.03) * 1.8; });
+    LowPass thud, muffle;
+    track.Add(0, 0.2, [&](double t) {
+        return muffle.Step(thud.Step(noise.Next(), 1500), 1500) * Percussive(t, 0.001, 0.03) * 2.5;
+    });
     Oscillator clank1, clank2;
     track.Add(0.004, 0.2, [&](double t) {
         return (SineOf(clank1.Step(1230)) + SineOf(clank2.Step(1877))) * Percussive(t, 0.001, 0.04) * 0.12;
