@@ -88,15 +88,7 @@ void Settle(Session& s)
 }
 
 // The channels played since the last call.
-std::vector<int> Sounds(Session& s)
-{
-    s.TakeOutput();
-    s.Run("sounds");
-    std::istringstream words(s.TakeOutput().substr(std::string("sounds:").size()));
-    std::vector<int> played;
-    for (int channel = 0; words >> channel;) played.push_back(channel);
-    return played;
-}
+std::vector<int> Sounds(Session& s) { return s.Sounds(); }
 
 bool Played(const std::vector<int>& sounds, int channel)
 {

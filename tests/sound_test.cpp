@@ -2,7 +2,6 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
-#include <sstream>
 #include <vector>
 
 #include "board/resolve.h"
@@ -16,17 +15,6 @@ using testing::Session;
 
 // Mission 1 open, the sound switch as given, every attribute 0, tutorial off.
 std::string Progress(int soundSwitch) { return " 1 \r\n " + std::to_string(soundSwitch) + " \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n"; }
-
-// The channels played since the last call.
-std::vector<int> Sounds(Session& s)
-{
-    s.TakeOutput();
-    s.Run("sounds");
-    std::istringstream words(s.TakeOutput().substr(std::string("sounds:").size()));
-    std::vector<int> played;
-    for (int channel = 0; words >> channel;) played.push_back(channel);
-    return played;
-}
 
 // Row 1 reads k k 3 k over a pattern with no run: swapping cells 13 and 14 lines up three icons of kind k.
 // Stops at the moment the run takes effect, before new icons fall and perhaps line up more.
@@ -50,33 +38,33 @@ TEST(Sound, EachMomentPlaysItsChannelAndOnlyWithTheSwitchOn)
         const auto expect = [&](std::vector<int> channels) { return soundSwitch == 1 ? channels : std::vector<int>{}; };
         Session s(41, Progress(soundSwitch));
         s.StartMission(0);
-        EXPECT_EQ(Sounds(s), expect({10})) << "the stage is set up";
+        EXPECT_EQ(s.Sounds(), expect({10})) << "the stage is set up";
 
         PlayRun(s, '0');
-        EXPECT_EQ(Sounds(s), expect({4})) << "grey bullets reload";
+        EXPECT_EQ(s.Sounds(), expect({4})) << "grey bullets reload";
         Settle(s);
-        Sounds(s);
+        s.Sounds();
         PlayRun(s, '2');
-        EXPECT_EQ(Sounds(s), expect({4})) << "so do grenades";
+        EXPECT_EQ(s.Sounds(), expect({4})) << "so do grenades";
         Settle(s);
-        Sounds(s);
+        s.Sounds();
 
         s.Run("set TerminalWork 1");
         PlayRun(s, '4');
-        EXPECT_EQ(Sounds(s), expect({5})) << "the door needs work";
+        EXPECT_EQ(s.Sounds(), expect({5})) << "the door needs work";
         s.AdvanceUntil([&] { return s.game.ui.StageDoneLabel->visible; });
-        EXPECT_EQ(Sounds(s), expect({7})) << "the door was the stage's goal";
+        EXPECT_EQ(s.Sounds(), expect({7})) << "the door was the stage's goal";
         s.AdvanceUntil([&] { return s.game.MissionStage == 1; });
-        EXPECT_EQ(Sounds(s), expect({10})) << "the next stage";
+        EXPECT_EQ(s.Sounds(), expect({10})) << "the next stage";
 
         Settle(s);
         s.Run("set EnemyHealth 1");
         PlayRun(s, '1');
-        const std::vector<int> shot = Sounds(s);
+        const std::vector<int> shot = s.Sounds();
         if (soundSwitch == 1) EXPECT_TRUE(shot == std::vector<int>{0} || shot == std::vector<int>{1});
         else EXPECT_TRUE(shot.empty());
         s.AdvanceUntil([&] { return s.game.ui.MissionCompleteScreen->visible; });
-        EXPECT_EQ(Sounds(s), expect({7, 13})) << "the last stage's goal, then the mission";
+        EXPECT_EQ(s.Sounds(), expect({7, 13})) << "the last stage's goal, then the mission";
     }
 }
 
@@ -84,13 +72,13 @@ TEST(Sound, EachMomentPlaysItsChannelAndOnlyWithTheSwitchOn)
 TEST(Sound, TheShotTakesTheSecondSoundFromFiftyUp)
 {
     Session s(43, Progress(1));
-    Sounds(s);
+    s.Sounds();
     int seconds = 0;
     for (int i = 0; i < 2000; ++i) {
         Random next = s.game.random;
         const float n = std::nearbyint(next.Draw() * 100.0f);
         PlayShot(s.game);
-        const std::vector<int> played = Sounds(s);
+        const std::vector<int> played = s.Sounds();
         ASSERT_EQ(played, std::vector<int>{n >= 50 ? 1 : 0}) << "draw " << i << ", n = " << n;
         seconds += played[0];
     }
