@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <functional>
-#include <sstream>
 #include <vector>
 
 #include "board/moves.h"
