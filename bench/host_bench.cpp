@@ -1,5 +1,6 @@
 // kruszarka-bench: what the SDL host costs a player. Prints start-up to the first presented frame, CPU over an
-// idle spell on the main menu with the real loop, the time to draw one full frame at 1x and 2x, and peak memory.
+// idle spell on the main menu and on the board with the real loop (the sound device closed), how soon a sound
+// starts after a silence, the time to draw one full frame at 1x and 2x, and peak memory.
 //
 //   kruszarka-bench [--idle-seconds N] [--frames N]
 //
@@ -15,6 +16,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <filesystem>
+#include <fstream>
 #include <string>
 #include <vector>
 
@@ -107,13 +109,47 @@ Uint32 PushQuit(Uint32, void*)
     return 0;
 }
 
+// Runs the window's real loop for `seconds`; returns the CPU milliseconds the process spent meanwhile.
+double RunFor(sdl::GameWindow& window, double seconds, double& wall)
+{
+    const double cpuBefore = CpuMilliseconds();
+    const Clock::time_point start = Clock::now();
+    SDL_AddTimer(static_cast<Uint32>(seconds * 1000), PushQuit, nullptr);
+    window.Run();
+    wall = MillisecondsSince(start);
+    return CpuMilliseconds() - cpuBefore;
+}
+
+void PrintIdle(const char* where, double cpu, double wall, uint64_t frames, const sdl::MixerSound& sound)
+{
+    std::printf("idle %-23s %.1f ms CPU over %.1f s (%.3f %%, %.2f ms per 30 s), %llu frames drawn, "
+                "sound device %s\n",
+                where, cpu, wall / 1000.0, 100.0 * cpu / wall, cpu * 30000.0 / wall,
+                static_cast<unsigned long long>(frames), sound.DeviceOpen() ? "OPEN" : "closed");
+}
+
+// From a Play after a silence to the moment the reopened device first asks for samples.
+void FirstSound(sdl::MixerSound& sound, int channel)
+{
+    if (!sound.HasSound()) return;
+    const uint64_t fed = sound.BuffersFed();
+    const Clock::time_point start = Clock::now();
+    sound.Play(channel);
+    const double play = MillisecondsSince(start);
+    while (sound.BuffersFed() == fed && MillisecondsSince(start) < 2000) SDL_Delay(0);
+    std::printf("first sound after a silence  %.1f ms from Play to the device's first buffer (Play itself %.1f ms)\n",
+                MillisecondsSince(start), play);
+}
+
 void StartUpAndIdle(const Options& options)
 {
     const Clock::time_point start = Clock::now();
     const sdl::Subsystem video(SDL_INIT_VIDEO | SDL_INIT_TIMER);
     const sdl::Assets assets = sdl::Assets::BesideExecutable();
-    sdl::MixerSound sound(assets);
+    sdl::MixerSound sound(assets, sdl::GameWindow::RealClock());
     BenchGame bench(sound);
+    // Mission 1 open, sound on, tutorial off: the board scene plays its start sound.
+    std::ofstream(bench.folder / "config.cfg") << " 1 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n";
     sdl::GameWindow window(bench.game, assets, sdl::ChooseScale());
     StartUp(bench.game, 7);
     window.Show();
@@ -121,23 +157,32 @@ void StartUpAndIdle(const Options& options)
     const double startUp = MillisecondsSince(start);
     sound.Start();
     const double soundReady = MillisecondsSince(start);
+    window.SetChore([&sound] { return sound.CloseWhenQuiet(); });
 
     std::printf("video driver                 %s, window scale %dx, sound %s\n", SDL_GetCurrentVideoDriver(),
-                window.Scale(), sound.HasDevice() ? SDL_GetCurrentAudioDriver() : "none");
+                window.Scale(), sound.HasSound() ? sound.Driver().c_str() : "none");
     std::printf("start-up to first frame      %.1f ms (in process: SDL, game, start-up, window, first present)\n",
                 startUp);
-    std::printf("sound ready                  %.1f ms after start (device opened after the first frame)\n",
+    std::printf("sound ready                  %.1f ms after start (device checked after the first frame)\n",
                 soundReady);
 
-    const uint64_t frames = window.FramesPresented();
-    const double cpuBefore = CpuMilliseconds();
-    const Clock::time_point idleStart = Clock::now();
-    SDL_AddTimer(static_cast<Uint32>(options.idleSeconds * 1000), PushQuit, nullptr);
-    window.Run();
-    const double wall = MillisecondsSince(idleStart);
-    const double cpu = CpuMilliseconds() - cpuBefore;
-    std::printf("idle on the main menu        %.1f ms CPU over %.1f s (%.3f %%), %llu frames drawn\n", cpu,
-                wall / 1000.0, 100.0 * cpu / wall, static_cast<unsigned long long>(window.FramesPresented() - frames));
+    double wall = 0;
+    uint64_t frames = window.FramesPresented();
+    double cpu = RunFor(window, options.idleSeconds, wall);
+    PrintIdle("on the main menu", cpu, wall, window.FramesPresented() - frames, sound);
+
+    FirstSound(sound, 0);
+    bench.Click("Gra");
+    bench.Click("Misja 1");
+    bench.Click("Rozpocznij misję ->");
+    // The board fills and the start sound ends; then the device closes after its linger.
+    const double settle = (sdl::MixerSound::kLingerMs + 3000) / 1000.0;
+    frames = window.FramesPresented();
+    cpu = RunFor(window, settle, wall);
+    PrintIdle("settling on the board", cpu, wall, window.FramesPresented() - frames, sound);
+    frames = window.FramesPresented();
+    cpu = RunFor(window, options.idleSeconds, wall);
+    PrintIdle("on the board", cpu, wall, window.FramesPresented() - frames, sound);
 }
 
 void FrameTimes(const ui::Form& form, const char* scene, int scale, int frames)

@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the Debian packages the game, its tests and its benchmarks need, when any is missing.
 set -euo pipefail
-packages=(cmake g++ make pkg-config libsdl2-dev libsdl2-ttf-dev libsdl2-image-dev libsdl2-mixer-dev
+packages=(cmake g++ make pkg-config libsdl2-dev libsdl2-ttf-dev libsdl2-image-dev
           fonts-liberation libgtest-dev libbenchmark-dev desktop-file-utils appstream)
 missing=()
 for p in "${packages[@]}"; do

@@ -3,7 +3,6 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <sstream>
 
 #include "board/moves.h"
 #include "board/resolve.h"
@@ -67,16 +66,6 @@ void Set(Session& s, std::initializer_list<std::string> assignments)
 void Settle(Session& s)
 {
     s.AdvanceUntil([&] { return s.game.InputReady && NothingRunning(s.game.timers); });
-}
-
-std::vector<int> Sounds(Session& s)
-{
-    s.TakeOutput();
-    s.Run("sounds");
-    std::istringstream words(s.TakeOutput().substr(std::string("sounds:").size()));
-    std::vector<int> played;
-    for (int channel = 0; words >> channel;) played.push_back(channel);
-    return played;
 }
 
 bool Played(const std::vector<int>& sounds, int channel)

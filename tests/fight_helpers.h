@@ -42,8 +42,6 @@ void Set(Session& s, std::initializer_list<std::string> assignments);
 // Until the board is the player's again: nothing animating, no attack, input released.
 void Settle(Session& s);
 
-// The channels played since the last call.
-std::vector<int> Sounds(Session& s);
 bool Played(const std::vector<int>& sounds, int channel);
 bool IsShot(const std::vector<int>& sounds);
 

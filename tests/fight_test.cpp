@@ -26,7 +26,7 @@ TEST(FightShots, DamageGrowsWithLengthGreenTipsAccuracyAndDeadlyBulletsAndTheBar
     Session s(11, kAllOpenWithSound);
     Enter(s, 1, 0);  // "Misja 2": an enemy of 40 health
     s.Run("set EnemyHitChance 0");
-    Sounds(s);
+    s.Sounds();
 
     // Three brown bullets, one green-tipped, Accuracy 0: (2 + 0) x 2 = 4. A full bar gets no marker.
     PlayRun(s, "1g1");
@@ -34,7 +34,7 @@ TEST(FightShots, DamageGrowsWithLengthGreenTipsAccuracyAndDeadlyBulletsAndTheBar
     EXPECT_EQ(s.Print("EnemyHealthBar.Width"), "1309.5");
     EXPECT_EQ(s.Print("HitMarker.Visible"), "False");
     EXPECT_FALSE(s.game.timers[kMarkerTimer].Enabled());
-    EXPECT_TRUE(IsShot(Sounds(s)));
+    EXPECT_TRUE(IsShot(s.Sounds()));
     // The hero's frame lights up and the (hidden) number starts its rise from the health label.
     EXPECT_EQ(s.Print("HeroShotFrame.Visible"), "True");
     EXPECT_EQ(s.Print("DamageLabel.Top"), "385");
@@ -112,9 +112,9 @@ TEST(FightShots, BulletsWithNoEnemyOnlyMakeAnImpactSound)
 {
     Session s(5, kAllOpenWithSound);
     Enter(s, 0, 0);  // "Misja 1", stage 0: a door, no enemy
-    Sounds(s);
+    s.Sounds();
     PlayRun(s, "1g1");
-    EXPECT_EQ(Sounds(s), std::vector<int>{3});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{3});
     EXPECT_EQ(s.Print("HeroShotFrame.Visible"), "False");
     EXPECT_FALSE(s.game.timers[kRiseTimer].Enabled());
     EXPECT_EQ(s.game.TerminalWork, 20);
@@ -130,7 +130,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         Session s(2, kAllOpenWithSound);
         Enter(s, 2, 2);  // "Misja 3", stage 2: the bomb
         Set(s, {"TerminalPresent True", "TerminalRequired True", "TerminalWork 20", "BombWork 2", "Dexterity 1"});
-        Sounds(s);
+        s.Sounds();
         PlayRun(s, "444");
         EXPECT_EQ(s.game.BombWork, -1);
         EXPECT_FALSE(s.game.BombPresent);
@@ -140,7 +140,7 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         EXPECT_EQ(s.Print("RequiredFrame(0).Visible"), "False");
         EXPECT_EQ(s.game.TerminalWork, 20) << "the surplus point is lost, not passed on";
         EXPECT_EQ(s.Print("TerminalWorkBar.Width"), "1455");
-        EXPECT_EQ(Sounds(s), std::vector<int>{5});
+        EXPECT_EQ(s.Sounds(), std::vector<int>{5});
         EXPECT_EQ(s.game.Resources[4], 1);
         Settle(s);
         EXPECT_FALSE(s.game.screen.StageDoneLabel->visible) << "the terminal is still required";
@@ -192,9 +192,9 @@ TEST(FightEngineering, PointsGoWholeToTheFirstGoalInNeedAndSurplusIsLost)
         // No door, terminal or bomb: an impact, but the wrench still pays its resource point.
         Session s(8, kAllOpenWithSound);
         Enter(s, 1, 0);
-        Sounds(s);
+        s.Sounds();
         PlayRun(s, "444");
-        EXPECT_EQ(Sounds(s), std::vector<int>{3});
+        EXPECT_EQ(s.Sounds(), std::vector<int>{3});
         EXPECT_EQ(s.game.Resources[4], 1);
     }
 }
@@ -203,17 +203,17 @@ TEST(FightHealing, RedCrossesHealUpToTheMaximumAndClinkAtFullHealth)
 {
     Session s(9, kAllOpenWithSound);
     Enter(s, 0, 0);
-    Sounds(s);
+    s.Sounds();
     PlayRun(s, "555");
-    EXPECT_EQ(Sounds(s), std::vector<int>{3});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{3});
     EXPECT_EQ(s.game.Health, 30);
     EXPECT_EQ(s.game.Resources[5], 1);
     Settle(s);
 
     Set(s, {"Health 29", "Intelligence 2"});
-    Sounds(s);
+    s.Sounds();
     PlayRun(s, "555");
-    EXPECT_EQ(Sounds(s), std::vector<int>{6});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{6});
     EXPECT_EQ(s.game.Health, 30) << "29 + 2 + 2 stops at the maximum";
 }
 
@@ -240,11 +240,11 @@ TEST(FightEnemyTurn, AMandatoryEnemyBlinksFourTimesShootsAtOneSecondAndHandsTheB
     EXPECT_EQ(s.Print("SelectionMarker.Visible"), "False");
     s.Advance(199);
     EXPECT_EQ(s.game.Health, 30);
-    Sounds(s);
+    s.Sounds();
     s.Advance(1);  // one second after the turn: the shot
     EXPECT_EQ(s.game.Health, 28);
     EXPECT_EQ(s.Print("Label6.Caption"), "\"28\"");
-    EXPECT_TRUE(IsShot(Sounds(s)));
+    EXPECT_TRUE(IsShot(s.Sounds()));
     EXPECT_EQ(s.Print("DamageLabel.Visible"), "True");
     EXPECT_EQ(s.Print("DamageLabel.Caption"), "\"2\"");
     EXPECT_EQ(s.Print("HeroShotFrame.Visible"), "False");
@@ -263,9 +263,9 @@ TEST(FightEnemyTurn, AMandatoryEnemyBlinksFourTimesShootsAtOneSecondAndHandsTheB
     StartRun(s, "000");
     s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
     s.Advance(999);
-    Sounds(s);
+    s.Sounds();
     s.Advance(1);
-    EXPECT_EQ(Sounds(s), std::vector<int>{2});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{2});
     EXPECT_EQ(s.game.Health, 28);
     EXPECT_EQ(s.Print("DamageLabel.Visible"), "False");
     EXPECT_EQ(s.Print("Pointer"), "NormalCursor");
@@ -294,14 +294,14 @@ TEST(FightEnemyTurn, AnOptionalEnemyBlinksWithoutAFrameAndAStageEndCutsItsShotOf
     Set(s, {"TerminalWork 1", "EnemyHitChance 101"});
     const int16_t health = s.game.Health;
     Lay(s, RunOfThree("444"));
-    Sounds(s);
+    s.Sounds();
     Swap(s, 13, 14);
     s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
     EXPECT_FALSE(s.game.timers[kAttackTimer].Enabled());
     EXPECT_EQ(s.Print("Pointer"), "NormalCursor");
     EXPECT_FALSE(s.game.InputReady);
     s.Advance(2000);
-    const std::vector<int> sounds = Sounds(s);
+    const std::vector<int> sounds = s.Sounds();
     EXPECT_TRUE(Played(sounds, 7));
     EXPECT_FALSE(Played(sounds, 0) || Played(sounds, 1) || Played(sounds, 2)) << "the enemy never fired";
     EXPECT_EQ(s.game.Health, health);
@@ -375,7 +375,7 @@ TEST(FightBomb, AnExpiredBombFailsTheMissionAndFreezesTheBoardMidSwap)
     Enter(s, 2, 2);
     s.Run("set BombTicks 2");
     Lay(s, RunOfThree("444"));
-    Sounds(s);
+    s.Sounds();
     Swap(s, 13, 14);
     s.Advance(100);
     EXPECT_EQ(s.game.BombTicks, 1);
@@ -384,7 +384,7 @@ TEST(FightBomb, AnExpiredBombFailsTheMissionAndFreezesTheBoardMidSwap)
     EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "True");
     EXPECT_EQ(s.game.timers[kFailureTimer].tag, "10");
     EXPECT_TRUE(s.game.timers[kFailureTimer].Enabled());
-    EXPECT_EQ(Sounds(s), (std::vector<int>{8, 9}));
+    EXPECT_EQ(s.Sounds(), (std::vector<int>{8, 9}));
     for (int timer = 1; timer <= 6; ++timer) EXPECT_FALSE(s.game.timers[timer].Enabled()) << "Timer" << timer;
     EXPECT_EQ(s.game.timers[kBombClock].Interval(), 100);
     EXPECT_FALSE(s.game.InputReady);
@@ -399,7 +399,7 @@ TEST(FightBomb, AnExpiredBombFailsTheMissionAndFreezesTheBoardMidSwap)
     EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "False");
     EXPECT_FALSE(s.game.timers[kFailureTimer].Enabled());
     s.Advance(10000);
-    EXPECT_TRUE(Sounds(s).empty()) << "no second failure";
+    EXPECT_TRUE(s.Sounds().empty()) << "no second failure";
 }
 
 TEST(FightBomb, AShotThatKillsAfterTheBombWentOffStartsNoSecondFailure)
@@ -410,20 +410,20 @@ TEST(FightBomb, AShotThatKillsAfterTheBombWentOffStartsNoSecondFailure)
     StartRun(s, "000");
     const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
     s.Run("set BombTicks 3");
-    Sounds(s);
+    s.Sounds();
     const int64_t boom = s.AdvanceUntil([&] { return s.game.timers[kFailureTimer].Enabled(); });
     EXPECT_LT(boom, turnEnd + 1000);
-    EXPECT_EQ(Sounds(s), (std::vector<int>{8, 9}));
+    EXPECT_EQ(s.Sounds(), (std::vector<int>{8, 9}));
     s.Advance(static_cast<int>(turnEnd + 1000 - Now(s)));
     EXPECT_LE(s.game.Health, 0) << "the enemy's shot still lands";
-    EXPECT_TRUE(IsShot(Sounds(s))) << "and no second defeat sounds";
+    EXPECT_TRUE(IsShot(s.Sounds())) << "and no second defeat sounds";
     EXPECT_FALSE(s.game.InputReady);
     s.Advance(static_cast<int>(boom + 7000 - 1 - Now(s)));
     EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "False");
     s.Advance(1);
     EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "True") << "7 s after the explosion, not after the death";
     s.Advance(10000);
-    EXPECT_TRUE(Sounds(s).empty());
+    EXPECT_TRUE(s.Sounds().empty());
 }
 
 // --- Death and leaving -------------------------------------------------------------------------------------
@@ -455,7 +455,7 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         Enter(s, 0, 1);
         Set(s, {"EnemyHitChance 101", "Health 11"});
         Lay(s, kDeadBoard, false);
-        Sounds(s);
+        s.Sounds();
         Swap(s, 11, 12);
         const int64_t turnEnd = s.AdvanceUntil([&] { return s.game.timers[kAttackTimer].Enabled(); });
         EXPECT_EQ(s.game.Health, 1);
@@ -472,7 +472,7 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "False");
         s.Advance(1);
         EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "True");
-        const std::vector<int> sounds = Sounds(s);
+        const std::vector<int> sounds = s.Sounds();
         EXPECT_EQ(std::count(sounds.begin(), sounds.end(), 8), 1) << "one defeat";
     }
     {
@@ -482,12 +482,12 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         Enter(s, 2, 2);
         s.Run("set Health 17");  // a third of 50 is 17
         Lay(s, kDeadBoard, false);
-        Sounds(s);
+        s.Sounds();
         Swap(s, 11, 12);
         const int64_t death = s.AdvanceUntil([&] { return s.game.timers[kFailureTimer].Enabled(); });
         EXPECT_EQ(s.game.Health, 0);
         EXPECT_FALSE(s.game.timers[kBombClock].Enabled());
-        EXPECT_EQ(Sounds(s), (std::vector<int>{11, 8}));
+        EXPECT_EQ(s.Sounds(), (std::vector<int>{11, 8}));
         const int16_t ticks = s.game.BombTicks;
         s.Advance(64 * 30);
         EXPECT_FALSE(s.game.timers[kFillTimer].Enabled());
@@ -498,7 +498,7 @@ TEST(FightEndings, DyingWhileTheBoardRenewsKeepsItLockedUntilTheMissionList)
         s.Advance(static_cast<int>(death + 7000 - Now(s)));
         EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "True");
         s.Advance(10000);
-        EXPECT_TRUE(Sounds(s).empty());
+        EXPECT_TRUE(s.Sounds().empty());
     }
 }
 
@@ -510,12 +510,12 @@ TEST(FightEndings, AHeroWhoDiesHasLostEvenWhenNoMandatoryGoalIsLeft)
     Enter(s, 0, 0);
     Set(s, {"TerminalPresent False", "TerminalRequired False", "Health 10"});
     Lay(s, Board({}));
-    Sounds(s);
+    s.Sounds();
     Swap(s, 11, 12);
     const int64_t death = s.AdvanceUntil([&] { return s.game.timers[kFailureTimer].Enabled(); });
     EXPECT_FALSE(s.game.timers[kStageDonePause].Enabled());
     EXPECT_EQ(s.Print("StageDoneLabel.Visible"), "False");
-    EXPECT_EQ(Sounds(s), (std::vector<int>{11, 8}));
+    EXPECT_EQ(s.Sounds(), (std::vector<int>{11, 8}));
     s.Advance(static_cast<int>(death + 7000 - Now(s)));
     EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "True");
     EXPECT_EQ(s.game.MissionStage, 0);
@@ -530,7 +530,7 @@ void ExpectLeftForGood(Session& s, int16_t stage, int16_t health)
     EXPECT_EQ(s.Print("StageDoneLabel.Visible"), "False");
     EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "False");
     EXPECT_EQ(s.Print("Pointer"), "NormalCursor");
-    Sounds(s);
+    s.Sounds();
     s.Advance(10000);
     EXPECT_EQ(s.Print("MainMenuScreen.Visible"), "True");
     EXPECT_EQ(s.Print("MissionMenuScreen.Visible"), "False");
@@ -538,7 +538,7 @@ void ExpectLeftForGood(Session& s, int16_t stage, int16_t health)
     EXPECT_EQ(s.game.MissionStage, stage);
     EXPECT_EQ(s.game.Health, health);
     for (int timer : {1, 2, 3, 4, 6, 7, 9, 11}) EXPECT_FALSE(s.game.timers[timer].Enabled()) << "Timer" << timer;
-    EXPECT_TRUE(Sounds(s).empty());
+    EXPECT_TRUE(s.Sounds().empty());
 }
 
 TEST(FightEndings, KeyTLeavesDuringTheStagePauseTheFailureOrTheEnemyTurn)

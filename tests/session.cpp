@@ -88,6 +88,16 @@ std::string Session::Print(const std::string& name)
     return line;
 }
 
+std::vector<int> Session::Sounds()
+{
+    TakeOutput();
+    Must("sounds");
+    std::istringstream words(TakeOutput().substr(std::string("sounds:").size()));
+    std::vector<int> played;
+    for (int channel = 0; words >> channel;) played.push_back(channel);
+    return played;
+}
+
 std::string Session::TakeOutput()
 {
     std::string text = out_.str();

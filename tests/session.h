@@ -3,6 +3,7 @@
 #include <functional>
 #include <sstream>
 #include <string>
+#include <vector>
 
 #include "shell/game.h"
 #include "tools/script.h"
@@ -51,6 +52,8 @@ public:
     std::string Print(const std::string& name);
     // Output printed so far, and cleared.
     std::string TakeOutput();
+    // The sound channels played since the last call.
+    std::vector<int> Sounds();
 
     // Starts mission `index` (0-based) from the main menu and lets the board fill.
     void StartMission(int index);

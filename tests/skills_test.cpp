@@ -177,14 +177,14 @@ TEST(AimedShot, HitsForOneToThreePlusStrengthAndTheEnemySkipsTwoTurns)
         Enter(s, 1, 0);
         Set(s, {"Strength 1", "Accuracy 2"});
         Afford(s, kAimedShot);
-        Sounds(s);
+        s.Sounds();
         Use(s, kAimedShot);
         const int damage = 40 - s.game.EnemyHealth;
         EXPECT_GE(damage, 2);
         EXPECT_LE(damage, 4) << "accuracy adds nothing to the shot";
         seen.insert(damage);
         EXPECT_EQ(s.game.ImmobilisedTurns, 2);
-        EXPECT_TRUE(IsShot(Sounds(s)));
+        EXPECT_TRUE(IsShot(s.Sounds()));
         EXPECT_EQ(s.game.Resources[0] + s.game.Resources[2] + s.game.Resources[3], 0);
         EXPECT_TRUE(s.game.InputReady) << "the shot is not a move";
     }
@@ -242,10 +242,10 @@ TEST(Healing, HealsItsRangeAndCostsATurnInAFight)
     Session full(5, kEverySkill);
     Enter(full, 0, 0);
     Afford(full, kHealing);
-    Sounds(full);
+    full.Sounds();
     Use(full, kHealing);
     EXPECT_EQ(full.game.Health, full.game.MaxHealth);
-    EXPECT_EQ(Sounds(full), std::vector<int>{3});
+    EXPECT_EQ(full.Sounds(), std::vector<int>{3});
 
     // In a fight the enemy answers, unless it is immobilised; no deadly-bullets move is used up.
     Session fight(5, kEverySkill);
@@ -271,10 +271,10 @@ TEST(DeadlyBullets, MultiplyBulletDamageForExactlyThreeMovesCascadesIncluded)
     Enter(s, 1, 0);  // an enemy of 40
     Set(s, {"EnemyHitChance 0", "Health 100", "MaxHealth 100"});
     Afford(s, kDeadlyBullets);
-    Sounds(s);
+    s.Sounds();
     s.Click("Label13(0)");
     EXPECT_EQ(s.game.DeadlyBulletsTurns, 3);
-    EXPECT_EQ(Sounds(s), std::vector<int>{4});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{4});
 
     // Move 1: the run of red crosses in row 3 drops two brown bullets onto a third in column 1, a second run
     // in the same move. Both hit twice as hard (Strength 0: x 2); the move counts once.
@@ -330,11 +330,11 @@ TEST(Grenade, ClearsThirteenCellsKeepsTheBorderAndHitsOncePerBrownBullet)
     Set(s, {"Strength 1", "Accuracy 2", "EnemyHitChance 0", "ImmobilisedTurns 3", "SwapUnmatched False"});
     Lay(s, Board({"........", "...1g...", "....1..."}));
     Afford(s, kGrenade);
-    Sounds(s);
+    s.Sounds();
     Use(s, kGrenade);
     s.Press(34);
     EXPECT_EQ(s.game.EnemyHealth, 36);
-    EXPECT_EQ(Sounds(s), std::vector<int>{9});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{9});
     EXPECT_TRUE(s.game.timers[kBlastTimer].Enabled());
     const int health = s.game.Health;
     Settle(s);
@@ -447,11 +447,11 @@ TEST(BulletTime, SlowsTheBombForFifteenSecondsWithTheSoundAtTheStartAndTheHalf)
     Enter(s, 2, 2);  // "Misja 3": the bomb of 1500 ticks
     ASSERT_TRUE(s.game.timers[kBombClock].Enabled());
     Afford(s, kBulletTime);
-    Sounds(s);
+    s.Sounds();
     const int16_t ticks = s.game.BombTicks;
     Use(s, kBulletTime);
     const int64_t start = Now(s);
-    EXPECT_EQ(Sounds(s), std::vector<int>{12});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{12});
     EXPECT_EQ(s.game.timers[kBombClock].Interval(), 200);
     EXPECT_EQ(s.Print("BulletTimeBar.Visible"), "True");
     EXPECT_EQ(s.Print("BulletTimeBar.Left"), "2400");
@@ -461,9 +461,9 @@ TEST(BulletTime, SlowsTheBombForFifteenSecondsWithTheSoundAtTheStartAndTheHalf)
     EXPECT_EQ(s.Print("BulletTimeBar.Width"), "3595");
     EXPECT_EQ(s.Print("BulletTimeBar.Left"), "2530");
     s.Advance(static_cast<int>(start + 7499 - Now(s)));
-    EXPECT_TRUE(Sounds(s).empty());
+    EXPECT_TRUE(s.Sounds().empty());
     s.Advance(1);
-    EXPECT_EQ(Sounds(s), std::vector<int>{12});
+    EXPECT_EQ(s.Sounds(), std::vector<int>{12});
     s.Advance(static_cast<int>(start + 14999 - Now(s)));
     EXPECT_TRUE(s.game.timers[kBulletTimeDuration].Enabled());
     s.Advance(1);
@@ -471,7 +471,7 @@ TEST(BulletTime, SlowsTheBombForFifteenSecondsWithTheSoundAtTheStartAndTheHalf)
     EXPECT_FALSE(s.game.timers[kBulletTimeBar].Enabled());
     EXPECT_EQ(s.Print("BulletTimeBar.Visible"), "False");
     EXPECT_EQ(s.game.timers[kBombClock].Interval(), 100);
-    EXPECT_TRUE(Sounds(s).empty());
+    EXPECT_TRUE(s.Sounds().empty());
 
     // Used again right after its half, it lasts two more duration ticks; the bar, restarted on a running
     // clock, runs out before the end and stops at nothing.
@@ -496,13 +496,13 @@ TEST(BulletTime, AnExplodingBombEndsItWithBothSounds)
     Afford(s, kBulletTime);
     Use(s, kBulletTime);
     Set(s, {"BombTicks 1"});
-    Sounds(s);
+    s.Sounds();
     s.Advance(199);
     EXPECT_FALSE(s.game.timers[kFailureTimer].Enabled());
     s.Advance(1);
     EXPECT_TRUE(s.game.timers[kFailureTimer].Enabled());
     EXPECT_EQ(s.Print("MissionFailedLabel.Visible"), "True");
-    EXPECT_EQ(Sounds(s), (std::vector<int>{8, 9}));
+    EXPECT_EQ(s.Sounds(), (std::vector<int>{8, 9}));
     EXPECT_FALSE(s.game.timers[kBulletTimeDuration].Enabled());
     EXPECT_FALSE(s.game.timers[kBulletTimeBar].Enabled());
     EXPECT_EQ(s.Print("BulletTimeBar.Visible"), "False");

@@ -96,6 +96,10 @@ void GameWindow::Run(const Clock& clock)
             const double wait = static_cast<double>(*due) - GameTime(clock());
             timeout = wait <= 0 ? 0 : static_cast<int>(std::min(std::ceil(wait), 86'400'000.0));
         }
+        if (const std::optional<double> chore = chore_ ? chore_() : std::nullopt) {
+            const int wait = static_cast<int>(std::clamp(std::ceil(*chore), 0.0, 86'400'000.0));
+            timeout = timeout < 0 ? wait : std::min(timeout, wait);
+        }
         SDL_Event event;
         if (SDL_WaitEventTimeout(&event, timeout)) {
             do {

@@ -50,6 +50,12 @@ public:
 
     static Clock RealClock();
 
+    // Host work outside the game's timers, such as closing an idle sound device: asked after every turn of
+    // the loop, it returns the milliseconds until it wants asking again, or nothing, and the loop sleeps no
+    // longer than that.
+    using Chore = std::function<std::optional<double>()>;
+    void SetChore(Chore chore) { chore_ = std::move(chore); }
+
 private:
     void Mouse(int x, int y, void (ui::Form::*deliver)(float, float));
     // The game's time at this clock reading, less what the game did not see.
@@ -65,6 +71,7 @@ private:
     uint64_t framesPresented_ = 0;
     std::optional<double> offset_;  // game time minus clock time
     std::string title_;
+    Chore chore_;
 };
 
 }  // namespace kr::sdl

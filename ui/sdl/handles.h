@@ -2,7 +2,6 @@
 #include <memory>
 
 #include <SDL.h>
-#include <SDL_mixer.h>
 #include <SDL_ttf.h>
 
 namespace kr::sdl {
@@ -23,7 +22,6 @@ using TexturePtr = std::unique_ptr<SDL_Texture, Destroyer<SDL_DestroyTexture>>;
 using SurfacePtr = std::unique_ptr<SDL_Surface, Destroyer<SDL_FreeSurface>>;
 using CursorPtr = std::unique_ptr<SDL_Cursor, Destroyer<SDL_FreeCursor>>;
 using FontPtr = std::unique_ptr<TTF_Font, Destroyer<TTF_CloseFont>>;
-using ChunkPtr = std::unique_ptr<Mix_Chunk, Destroyer<Mix_FreeChunk>>;
 
 // One started SDL subsystem; SDL counts starts, so nested owners are fine.
 class Subsystem {

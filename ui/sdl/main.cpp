@@ -60,7 +60,7 @@ int main(int argc, char** argv)
         if (userFolder) EnterUserFolder();
         const sdl::Subsystem video(SDL_INIT_VIDEO);
         const sdl::Assets assets = sdl::Assets::BesideExecutable();
-        sdl::MixerSound sound(assets);
+        sdl::MixerSound sound(assets, sdl::GameWindow::RealClock());
         sdl::SdlMessageBoxes messages;
         Game game{Host{messages, sound}};
         sdl::GameWindow gameWindow(game, assets, sdl::ChooseScale());
@@ -74,6 +74,7 @@ int main(int argc, char** argv)
         gameWindow.Show();
         gameWindow.Redraw();
         sound.Start();
+        gameWindow.SetChore([&sound] { return sound.CloseWhenQuiet(); });
         gameWindow.Run();
         return 0;
     } catch (const std::exception& error) {

@@ -141,5 +141,32 @@ TEST_F(GameWindowTest, LoopEndsOnCloseAndOnExit)
     EXPECT_TRUE(game.quitRequested);
 }
 
+Uint32 PushQuit(Uint32, void*)
+{
+    SDL_Event quit{};
+    quit.type = SDL_QUIT;
+    SDL_PushEvent(&quit);
+    return 0;
+}
+
+// The host's own chores wake the idle loop when they ask to, and not otherwise.
+TEST_F(GameWindowTest, IdleLoopSleepsUntilTheChoreIsDue)
+{
+    // Every timer stopped, so that only the chore can wake the loop.
+    for (int timer = 1; timer <= ui::TimerBank::kCount; ++timer) game.timers[timer].SetEnabled(false);
+    std::vector<Uint64> asked;
+    window.SetChore([&asked]() -> std::optional<double> {
+        asked.push_back(SDL_GetTicks64());
+        if (asked.size() == 1) return 40.0;
+        PushQuit(0, nullptr);
+        return std::nullopt;
+    });
+    const SDL_TimerID safety = SDL_AddTimer(2000, PushQuit, nullptr);
+    window.Run();
+    SDL_RemoveTimer(safety);
+    ASSERT_EQ(asked.size(), 2u) << "the loop woke for the chore";
+    EXPECT_GE(asked[1] - asked[0], 39u) << "and slept until it was due";
+}
+
 }  // namespace
 }  // namespace kr::sdl
