@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cmath>
 
+#include "ui/sdl/focus_ring.h"
+
 namespace kr::sdl {
 namespace {
 
@@ -48,6 +50,7 @@ void FormRenderer::Draw(const ui::Form& form)
     SDL_SetRenderDrawColor(renderer_, kWindowColour.r, kWindowColour.g, kWindowColour.b, 255);
     SDL_RenderClear(renderer_);
     for (const ui::Control* root : form.Roots()) DrawTree(form, *root);
+    DrawFocusRing(renderer_, form);
     SDL_RenderSetClipRect(renderer_, nullptr);
     text_.EndFrame();
 }
