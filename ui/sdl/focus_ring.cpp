@@ -12,6 +12,7 @@ constexpr int kButtonInset = 2;
 // A check box's ring goes round its caption, clear of the square.
 constexpr int kCaptionLead = 2;
 
+// By its luma, so the ring stands out on the grey, blue and yellow buttons alike.
 bool Dark(ui::Colour c) { return 299 * c.r + 587 * c.g + 114 * c.b < 128 * 1000; }
 
 }  // namespace

@@ -164,11 +164,13 @@ TEST_P(CaptionFit, MenuScreens)
 TEST_P(CaptionFit, GameScreen)
 {
     game.TutorialOn = 1;
+    game.UnlockedMissions = 11;  // every skill slot in sight, the last one with its "5x" labels
     session.Click("Gra");
     session.Click("Misja 1");
     session.Click("Rozpocznij misję ->");
     game.timers.Advance(3000);
     ASSERT_FALSE(game.ui.MenuLayer->visible);
+    ASSERT_TRUE(game.ui.SkillFrames[6]->visible);
     for (int16_t page = 1; page <= 14; ++page) {
         ShowHint(game, page);
         ExpectAllFit("tutorial page " + std::to_string(page));
