@@ -145,7 +145,7 @@ void BuildHeroPanel(Builder& b, Screen& s)
     s.HeroPortrait = &b.Picture(s.HeroPanel, "Image3", 600, 240, 735, 495, {ui::PictureSet::Hero, 0});
     s.HealthFill = &b.Solid(s.HeroPanel, "Shape7(0)", 240, 240, 255, 495, kBarRed);
     s.HealthFrame = &b.Outline(s.HeroPanel, "Shape7(1)", 240, 240, 255, 495, kBlack, 1);
-    s.HealthLabel = &b.Label(s.HeroPanel, "Label6", 230, 385, 255, 255, "90", kWhite,
+    s.HealthLabel = &b.Label(s.HeroPanel, "Label6", 240, 385, 255, 255, "90", kWhite,
                              Font{Face::Narrow, true, 8.25f}, Align::Centre);
     s.HealthLabel->wordWrap = false;
     for (int i = 0; i < 30; ++i) {

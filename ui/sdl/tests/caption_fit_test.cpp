@@ -194,12 +194,18 @@ TEST_P(CaptionFit, GameScreen)
         notice->visible = false;
     }
 
-    // The widest figures the health bar shows: a full bar late in the campaign and a death below zero.
+    // The widest figures the health bar shows, a full bar late in the campaign and a death below zero, stay
+    // inside the bar's outline.
+    const PixelRect bar = ToPixels(game.form.Bounds(*game.ui.HealthFrame));
     for (const int16_t health : {int16_t{180}, int16_t{-11}, int16_t{-59}}) {
         game.MaxHealth = 180;
         game.Health = health;
         RefreshHeroPanel(game);
         ExpectAllFit("health " + std::to_string(health));
+        for (const auto& [left, right] : ruler.LineSpans(game.form, *game.ui.HealthLabel)) {
+            EXPECT_GE(left, (bar.x + 1) * scale) << health << " crosses the bar's left edge";
+            EXPECT_LE(right, (bar.x + bar.w - 1) * scale) << health << " crosses the bar's right edge";
+        }
     }
 }
 
