@@ -143,8 +143,8 @@ void BuildHeroPanel(Builder& b, Screen& s)
     s.HeroPortrait = &b.Picture(s.HeroPanel, "Image3", 600, 240, 735, 495, {ui::PictureSet::Hero, 0});
     s.HealthFill = &b.Solid(s.HeroPanel, "Shape7(0)", 240, 240, 255, 495, kBarRed);
     s.HealthFrame = &b.Outline(s.HeroPanel, "Shape7(1)", 240, 240, 255, 495, kBlack, 1);
-    s.HealthLabel = &b.Label(s.HeroPanel, "Label6", 230, 385, 255, 255, "90", kWhite, Sans(8.25f, true),
-                             Align::Centre);
+    s.HealthLabel = &b.Label(s.HeroPanel, "Label6", 240, 385, 255, 255, "90", kWhite,
+                             Font{Face::Narrow, true, 8.25f}, Align::Centre);
     s.HealthLabel->wordWrap = false;
     for (int i = 0; i < 30; ++i) {
         const int row = i / 6, column = i % 6;
@@ -270,8 +270,10 @@ void BuildTutorialArea(Builder& b, Screen& s)
     s.HintLabel = &b.Label(panel, "Label16", 120, 280, 4335, 735, "", kBlack, Sans(8.25f));
     s.PageLabel = &b.Label(panel, "Label17", 3840, 120, 375, 255, "", kBlack, Sans(8.25f, true), Align::Right);
     b.Label(panel, "Label18", 4200, 120, 375, 255, "/14", kBlack, Sans(8.25f, true));
-    s.PreviousHint = &b.Label(panel, "Label19", 600, 960, 1095, 255, "<---poprzednia", kBlack, Sans(8.25f));
-    s.NextHint = &b.Label(panel, "Label20", 2640, 960, 1095, 255, "następna--->", kBlack, Sans(8.25f), Align::Right);
+    s.PreviousHint = &b.Label(panel, "Label19", 600, 960, 1095, 255, "<---poprzednia", kBlack,
+                              Font{Face::Narrow, false, 8.25f});
+    s.NextHint = &b.Label(panel, "Label20", 2640, 960, 1095, 255, "następna--->", kBlack,
+                          Font{Face::Narrow, false, 8.25f}, Align::Right);
     s.CloseHints = &b.Label(panel, "Label21", 4200, 960, 255, 255, "X", kBlack, Sans(8.25f, true), Align::Centre);
     for (Control* hint : {s.PreviousHint, s.NextHint, s.CloseHints}) {
         hint->transparent = false;
@@ -287,10 +289,10 @@ void BuildMessages(Builder& b, Screen& s)
 {
     s.BulletTimeBar = &b.Solid(nullptr, "Shape11", 2400, 0, 3855, 135, kGoalYellow);
     s.BulletTimeBar->visible = false;
-    s.StageDoneLabel = &b.Message("Label2", 2040, 1680, 4815, 1695, "Zadanie wykonane!", kGreen, 36);
-    s.NoMovesLabel = &b.Message("Label5", 2160, 1440, 4815, 2775, "Brak możliwych ruchów", Colour{255, 128, 0}, 36);
-    s.MissionFailedLabel = &b.Message("Label7", 2040, 1680, 4815, 2775, "Misja nieudana!", Colour{247, 40, 102}, 36);
-    s.ReturnPrompt = &b.Message("Label3", 2040, 1920, 4815, 975, "Wrócić do menu? (t/n)", kYellow, 20.25f);
+    s.StageDoneLabel = &b.Message("Label2", 2040, 1680, 4815, 1695, "Zadanie wykonane!", kGreen, 30);
+    s.NoMovesLabel = &b.Message("Label5", 2160, 1440, 4815, 2775, "Brak możliwych ruchów", Colour{255, 128, 0}, 30);
+    s.MissionFailedLabel = &b.Message("Label7", 2040, 1680, 4815, 2775, "Misja nieudana!", Colour{247, 40, 102}, 30);
+    s.ReturnPrompt = &b.Message("Label3", 2040, 1920, 4815, 975, "Wrócić do menu? (t/n)", kYellow, 19.5f);
 }
 
 void BuildMainAndMissionMenus(Builder& b, Screen& s)

@@ -83,6 +83,7 @@ TEST(Replays, TheScenarioLanguageReportsFailuresAndBadLines)
     EXPECT_NE(output.find("must be a page 1..14"), std::string::npos);
     EXPECT_EQ(run("start\ncall GenerateCell 19\n", &output), 2);
     EXPECT_EQ(run("click \"Misja 4\"\n", &output), 2) << "a caption must belong to a visible control";
+    EXPECT_EQ(run("start\nkey 9 ctrl\n", &output), 2) << "shift is the one modifier a key takes";
     EXPECT_EQ(run("start\nset Board(45) 3\nset GreenFlag(45) True\nset BriefingText \"a\\\"b\"\nprint Board(45)\n"
                   "print BriefingText\nboard\n01234012\n12340123\n23401234\n3401234g\n40123401\n01234012\n12340123\n"
                   "23401234\ndump\n",

@@ -94,7 +94,10 @@ std::optional<int> ScriptRunner::Execute(const std::string& line, std::istream& 
     } else if (verb == "click" || verb == "press" || verb == "move") {
         Deliver(verb, rest);
     } else if (verb == "key") {
-        g.form.KeyDown(static_cast<int>(ParseWhole(rest)));
+        // "key 9 shift" is Shift+Tab.
+        const auto [code, modifier] = Verb(rest);
+        if (!modifier.empty() && modifier != "shift") throw ScriptError("key takes a code and optionally shift");
+        g.form.KeyDown(static_cast<int>(ParseWhole(code)), !modifier.empty());
     } else if (verb == "wait") {
         const int64_t ms = ParseWhole(rest);
         if (ms < 0) throw ScriptError("wait takes a positive time");

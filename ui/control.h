@@ -11,8 +11,9 @@ namespace kr::ui {
 enum class ControlKind : uint8_t { Panel, Picture, Label, Button, CheckBox, Shape };
 enum class ShapeKind : uint8_t { Rectangle, Circle };
 enum class Align : uint8_t { Left, Centre, Right };
-// Mono is the game's "Courier New" (same metrics); Sans its bold sans-serif face.
-enum class Face : uint8_t { Mono, Sans };
+// Mono is the game's "Courier New" (same metrics); Sans its sans-serif face; Narrow a condensed sans for
+// figures and captions that must fit a small box.
+enum class Face : uint8_t { Mono, Sans, Narrow };
 
 struct Colour {
     uint8_t r = 0, g = 0, b = 0;

@@ -96,6 +96,7 @@ Control* Form::HitTest(float x, float y) const { return HitIn(roots_, x, y); }
 
 void Form::MouseDown(float x, float y)
 {
+    focused_ = nullptr;
     pressed_ = HitTest(x, y);
     if (pressed_ && pressed_->onMouseDown) pressed_->onMouseDown();
 }
@@ -105,8 +106,13 @@ void Form::MouseUp(float x, float y)
     Control* pressed = pressed_;
     pressed_ = nullptr;
     if (!pressed || pressed != HitTest(x, y)) return;
-    if (pressed->kind == ControlKind::CheckBox) pressed->value = pressed->value == 1 ? 0 : 1;
-    if (pressed->onClick) pressed->onClick();
+    Click(*pressed);
+}
+
+void Form::Click(Control& control)
+{
+    if (control.kind == ControlKind::CheckBox) control.value = control.value == 1 ? 0 : 1;
+    if (control.onClick) control.onClick();
 }
 
 void Form::MouseMove(float x, float y)
@@ -119,9 +125,74 @@ void Form::MouseMove(float x, float y)
     }
 }
 
-void Form::KeyDown(int keyCode)
+void Form::KeyDown(int keyCode, bool shift)
 {
-    if (onKeyDown) onKeyDown(keyCode);
+    // A focus lost to a hidden or disabled control is forgotten, so it cannot come back with its screen.
+    focused_ = Focused();
+    bool used = false;
+    switch (keyCode) {
+    case kTabKey: used = MoveFocus(shift ? -1 : 1); break;
+    case kRightKey:
+    case kDownKey: used = MoveFocus(1); break;
+    case kLeftKey:
+    case kUpKey: used = MoveFocus(-1); break;
+    case kEnterKey:
+    case kSpaceKey: used = ActivateFocus(); break;
+    default: break;
+    }
+    if (!used && onKeyDown) onKeyDown(keyCode);
+}
+
+bool Form::Focusable(const Control& control) const
+{
+    if (control.kind != ControlKind::Button && control.kind != ControlKind::CheckBox) return false;
+    // The hit test at its centre answers for all the rest: shown and enabled through every panel holding
+    // it, inside the window and not lying under another screen.
+    const Rect seen = VisibleBounds(control);
+    if (seen.width <= 0 || seen.height <= 0) return false;
+    return HitTest(seen.left + seen.width / 2, seen.top + seen.height / 2) == &control;
+}
+
+std::vector<Control*> Form::FocusOrder() const
+{
+    std::vector<Control*> order;
+    for (const auto& control : controls_)
+        if (Focusable(*control)) order.push_back(control.get());
+    std::stable_sort(order.begin(), order.end(), [this](const Control* a, const Control* b) {
+        const Rect ra = Bounds(*a), rb = Bounds(*b);
+        return ra.top != rb.top ? ra.top < rb.top : ra.left < rb.left;
+    });
+    return order;
+}
+
+Control* Form::Focused() const { return focused_ && Focusable(*focused_) ? focused_ : nullptr; }
+
+bool Form::MoveFocus(int step)
+{
+    const std::vector<Control*> order = FocusOrder();
+    if (order.empty()) {
+        focused_ = nullptr;
+        return false;
+    }
+    const auto count = static_cast<std::ptrdiff_t>(order.size());
+    const auto at = std::find(order.begin(), order.end(), Focused());
+    std::ptrdiff_t next = 0;
+    if (at != order.end()) next = ((at - order.begin() + step) % count + count) % count;
+    else if (step < 0) next = count - 1;
+    focused_ = order[static_cast<size_t>(next)];
+    return true;
+}
+
+bool Form::ActivateFocus()
+{
+    Control* control = Focused();
+    if (!control) return false;
+    Click(*control);
+    if (!Focused()) {
+        const std::vector<Control*> order = FocusOrder();
+        focused_ = order.empty() ? nullptr : order.front();
+    }
+    return true;
 }
 
 }  // namespace kr::ui

@@ -21,6 +21,15 @@ public:
     static constexpr float kWidth = 8640;   // client area, twips
     static constexpr float kHeight = 6705;
 
+    // The keys the keyboard focus answers to.
+    static constexpr int kTabKey = 9;
+    static constexpr int kEnterKey = 13;
+    static constexpr int kSpaceKey = 32;
+    static constexpr int kLeftKey = 37;
+    static constexpr int kUpKey = 38;
+    static constexpr int kRightKey = 39;
+    static constexpr int kDownKey = 40;
+
     Form() = default;
     Form(const Form&) = delete;
     Form& operator=(const Form&) = delete;
@@ -50,11 +59,26 @@ public:
     // The topmost shown, enabled control under the point that takes the mouse, or nullptr (window background).
     Control* HitTest(float x, float y) const;
 
-    // Input, in window twips. A click is a mouse-down and a release over the same control.
+    // Input, in window twips. A click is a mouse-down and a release over the same control; a press also
+    // takes the keyboard focus away, as the mouse is then in use.
     void MouseDown(float x, float y);
     void MouseUp(float x, float y);
     void MouseMove(float x, float y);
-    void KeyDown(int keyCode);
+    // Tab (Shift+Tab backwards) and the arrows move the keyboard focus, Enter and Space click the focused
+    // control; other keys, and these when they have nothing to act on, go to onKeyDown.
+    void KeyDown(int keyCode, bool shift = false);
+
+    // The buttons and check boxes the keyboard can reach on what is shown: enabled, in sight and not covered,
+    // top to bottom and, at the same top, left to right.
+    std::vector<Control*> FocusOrder() const;
+    // The focused control, or nullptr; one hidden, disabled or covered since it took the focus has lost it.
+    Control* Focused() const;
+    // Moves the focus `step` places along the order, wrapping round; without a focus, forwards starts at the
+    // first control and backwards at the last. False when nothing can take the focus.
+    bool MoveFocus(int step);
+    // Clicks the focused control with the mouse's own handler. When the click takes the screen away, the
+    // focus moves to the first control of the screen shown now, or is cleared. False without a focus.
+    bool ActivateFocus();
 
     std::function<void(int)> onKeyDown;
     std::function<void()> onBackgroundMouseMove;
@@ -65,11 +89,14 @@ public:
 
 private:
     Control* HitIn(const std::vector<Control*>& layer, float x, float y) const;
+    bool Focusable(const Control& control) const;
+    void Click(Control& control);
 
     std::vector<std::unique_ptr<Control>> controls_;
     std::vector<Control*> roots_;
     std::map<std::string, Control*, std::less<>> names_;
     Control* pressed_ = nullptr;
+    Control* focused_ = nullptr;
 };
 
 }  // namespace kr::ui

@@ -14,6 +14,9 @@ const char* FileOf(ui::Face face, bool bold)
     if (face == ui::Face::Mono)
         return bold ? "/usr/share/fonts/truetype/liberation/LiberationMono-Bold.ttf"
                     : "/usr/share/fonts/truetype/liberation/LiberationMono-Regular.ttf";
+    if (face == ui::Face::Narrow)
+        return bold ? "/usr/share/fonts/truetype/liberation/LiberationSansNarrow-Bold.ttf"
+                    : "/usr/share/fonts/truetype/liberation/LiberationSansNarrow-Regular.ttf";
     return bold ? "/usr/share/fonts/truetype/liberation/LiberationSans-Bold.ttf"
                 : "/usr/share/fonts/truetype/liberation/LiberationSans-Regular.ttf";
 }

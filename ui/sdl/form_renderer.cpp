@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cmath>
 
+#include "ui/sdl/focus_ring.h"
+
 namespace kr::sdl {
 namespace {
 
@@ -10,7 +12,6 @@ constexpr int kTwipsPerPixel = 15;
 constexpr ui::Colour kBlack{0, 0, 0};
 constexpr ui::Colour kWhite{255, 255, 255};
 constexpr ui::Colour kGreyedText{128, 128, 128};
-constexpr int kCheckSide = 13;
 
 int ToPixel(float twips) { return static_cast<int>(std::floor(twips / kTwipsPerPixel + 0.5f)); }
 
@@ -49,6 +50,7 @@ void FormRenderer::Draw(const ui::Form& form)
     SDL_SetRenderDrawColor(renderer_, kWindowColour.r, kWindowColour.g, kWindowColour.b, 255);
     SDL_RenderClear(renderer_);
     for (const ui::Control* root : form.Roots()) DrawTree(form, *root);
+    DrawFocusRing(renderer_, form);
     SDL_RenderSetClipRect(renderer_, nullptr);
     text_.EndFrame();
 }
@@ -100,24 +102,22 @@ void FormRenderer::DrawLabel(const ui::Control& control, PixelRect rect, PixelRe
         if (!control.transparent) FillRect(renderer_, rect, control.back);
         if (control.bordered) FrameRect(renderer_, rect, 1, kBlack);
     }
-    const int inset = control.bordered ? 1 : 0;
     Clip(ancestors);
-    DrawText(control, {{rect.x + inset, rect.y + inset, rect.w - 2 * inset, rect.h - 2 * inset},
-                       control.align, control.wordWrap, false});
+    DrawText(control, CaptionBox(control, rect));
 }
 
 void FormRenderer::DrawButton(const ui::Control& control, PixelRect rect)
 {
     FillRect(renderer_, rect, control.back);
     FrameRect(renderer_, rect, 1, Darker(control.back));
-    DrawText(control, {{rect.x + 2, rect.y + 2, rect.w - 4, rect.h - 4}, ui::Align::Centre, true, true});
+    DrawText(control, CaptionBox(control, rect));
 }
 
 void FormRenderer::DrawCheckBox(const ui::Control& control, PixelRect rect, PixelRect ancestors)
 {
     Clip(ancestors);
     FillRect(renderer_, rect, control.back);
-    const PixelRect box{rect.x, rect.y + (rect.h - kCheckSide) / 2, kCheckSide, kCheckSide};
+    const PixelRect box{rect.x, rect.y + (rect.h - kCheckBoxSide) / 2, kCheckBoxSide, kCheckBoxSide};
     FillRect(renderer_, box, kWhite);
     FrameRect(renderer_, box, 1, kBlack);
     if (control.value == 1) {
@@ -129,8 +129,7 @@ void FormRenderer::DrawCheckBox(const ui::Control& control, PixelRect rect, Pixe
                     SDL_RenderFillRect(renderer_, &dot);
                 }
     }
-    const int gap = kCheckSide + 4;
-    DrawText(control, {{rect.x + gap, rect.y, rect.w - gap, rect.h}, ui::Align::Left, false, true});
+    DrawText(control, CaptionBox(control, rect));
 }
 
 void FormRenderer::DrawShape(const ui::Control& control, PixelRect rect)
@@ -148,7 +147,7 @@ void FormRenderer::DrawShape(const ui::Control& control, PixelRect rect)
 void FormRenderer::DrawText(const ui::Control& control, const TextBox& where)
 {
     if (control.caption.empty()) return;
-    const int wrapWidth = where.wrap ? std::max(where.box.w * scale_, 1) : 0;
+    const int wrapWidth = where.wrap ? std::max(where.room * scale_, 1) : 0;
     const std::vector<std::string>& lines = text_.Lines(control.caption, control.font, wrapWidth);
     if (control.enabled) {
         DrawLines(lines, control.font, control.fore, where, 0);

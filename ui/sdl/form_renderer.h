@@ -3,6 +3,7 @@
 
 #include "ui/form.h"
 #include "ui/sdl/assets.h"
+#include "ui/sdl/caption_box.h"
 #include "ui/sdl/fonts.h"
 #include "ui/sdl/pictures.h"
 #include "ui/sdl/shapes.h"
@@ -31,13 +32,6 @@ public:
     uint64_t Rasterised() const { return pictures_.Rasterised() + text_.Rasterised(); }
 
 private:
-    struct TextBox {
-        PixelRect box;
-        ui::Align align = ui::Align::Left;
-        bool wrap = false;
-        bool centreVertically = false;
-    };
-
     void DrawTree(const ui::Form& form, const ui::Control& control);
     void DrawPicture(const ui::Control& control, PixelRect rect);
     void DrawLabel(const ui::Control& control, PixelRect rect, PixelRect own, PixelRect ancestors);

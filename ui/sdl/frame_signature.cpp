@@ -98,6 +98,7 @@ uint64_t FrameSignature(const ui::Form& form)
     Hash hash;
     for (const ui::Control* root : form.Roots()) AddTree(hash, *root);
     hash.Add(form.pointer);
+    hash.Add(form.Focused());
     return hash.Value();
 }
 

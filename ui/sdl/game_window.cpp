@@ -138,7 +138,8 @@ bool GameWindow::Handle(const SDL_Event& event)
         Mouse(event.motion.x, event.motion.y, &ui::Form::MouseMove);
         break;
     case SDL_KEYDOWN:
-        if (const std::optional<int> code = GameKeyCode(event.key.keysym.sym)) game_.form.KeyDown(*code);
+        if (const std::optional<int> code = GameKeyCode(event.key.keysym.sym))
+            game_.form.KeyDown(*code, ShiftHeld(event.key.keysym.mod));
         break;
     case SDL_WINDOWEVENT:
         // The window's pixels were lost or resized: the next Redraw must draw even an unchanged frame.

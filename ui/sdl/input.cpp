@@ -24,6 +24,8 @@ std::optional<int> GameKeyCode(SDL_Keycode key)
     }
 }
 
+bool ShiftHeld(Uint16 modifiers) { return (modifiers & KMOD_SHIFT) != 0; }
+
 float PixelToTwips(int pixel) { return static_cast<float>(pixel * 15 + 7); }
 
 }  // namespace kr::sdl

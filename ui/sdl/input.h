@@ -10,6 +10,9 @@ namespace kr::sdl {
 // for keys the game has no code for.
 std::optional<int> GameKeyCode(SDL_Keycode key);
 
+// Whether a key came with either Shift key held, which turns Tab backwards.
+bool ShiftHeld(Uint16 modifiers);
+
 // A window pixel (1x, as SDL reports mouse positions under a logical size) to the twip at its centre.
 float PixelToTwips(int pixel);
 

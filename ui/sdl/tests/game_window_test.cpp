@@ -21,11 +21,12 @@ SDL_Event MouseButton(Uint32 type, SDL_Point at)
     return event;
 }
 
-SDL_Event Key(SDL_Keycode key)
+SDL_Event Key(SDL_Keycode key, Uint16 modifiers = KMOD_NONE)
 {
     SDL_Event event{};
     event.type = SDL_KEYDOWN;
     event.key.keysym.sym = key;
+    event.key.keysym.mod = modifiers;
     return event;
 }
 
@@ -106,6 +107,26 @@ TEST_F(GameWindowTest, PlaysFromTheMenuIntoAMissionAndBack)
     EXPECT_TRUE(game.quitRequested);
 }
 
+// The menus from SDL's keys: Shift+Tab goes backwards, either Shift key will do, Return presses.
+TEST_F(GameWindowTest, TabShiftTabAndReturn)
+{
+    window.Tick(clock);
+    window.Redraw();
+    window.Handle(Key(SDLK_TAB, KMOD_LSHIFT));
+    EXPECT_EQ(game.form.Focused(), game.screen.ExitButton);
+    EXPECT_TRUE(window.Redraw()) << "the ring moved";
+    window.Handle(Key(SDLK_TAB, KMOD_RSHIFT));
+    EXPECT_EQ(game.form.Focused(), game.screen.OptionsButton);
+    window.Handle(Key(SDLK_TAB, KMOD_NUM));
+    EXPECT_EQ(game.form.Focused(), game.screen.ExitButton);
+    window.Handle(Key(SDLK_UP));
+    window.Handle(Key(SDLK_UP));
+    EXPECT_EQ(game.form.Focused(), game.screen.PlayButton);
+    window.Handle(Key(SDLK_RETURN));
+    EXPECT_TRUE(game.screen.MissionMenuScreen->visible);
+    EXPECT_EQ(game.form.Focused(), game.screen.MissionButtons[0]);
+}
+
 // A stall (a modal box, a suspended machine) resumes the game where it stopped instead of replaying it.
 TEST_F(GameWindowTest, StallIsNotReplayed)
 {
@@ -126,8 +147,10 @@ TEST_F(GameWindowTest, StallIsNotReplayed)
 // The real loop on the real clock ends on the window's close and on the game's own request.
 TEST_F(GameWindowTest, LoopEndsOnCloseAndOnExit)
 {
+    // Closing the window's frame ends the game as "Wyjście" does.
     SDL_Event quit{};
     quit.type = SDL_QUIT;
+    ASSERT_FALSE(window.Handle(quit));
     SDL_PushEvent(&quit);
     window.Run();
     EXPECT_FALSE(game.quitRequested);
