@@ -20,7 +20,7 @@ void StartUp(Game& g, uint32_t seed)
     OpenSoundChannels(g);
     FillSkillCost(g);
 
-    if (!LoadProgress(g)) g.host.messages.ShowOk(kMissingProgressMessage);
+    if (!LoadProgress(g)) g.host.messages.ShowOk(LoadFailureMessage(g));
 
     g.ui.MainMenuScreen->left = 2280;
     g.ui.MainMenuScreen->top = 960;
