@@ -1,8 +1,13 @@
 #include <gtest/gtest.h>
+#include <signal.h>
 #include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 #include <filesystem>
+#include <random>
 
+#include "shell/progress.h"
 #include "tests/session.h"
 
 namespace kr {
@@ -108,6 +113,35 @@ TEST(HostileProgressFile, ASaveNeverFollowsNorWaitsOnWhatIsPlantedAtTheTemporary
     ToggleSoundAndSave(s);
     EXPECT_EQ(ReadFile(s.folder().File("config.cfg")), kSaved);
     EXPECT_TRUE(fs::is_fifo(planted));
+}
+
+TEST(HostileProgressFile, ASaveKilledAtAnyMomentLeavesTheOldOrTheNewFileWhole)
+{
+    Session s(3, kSaved);
+    const fs::path file = s.folder().File("config.cfg");
+    std::mt19937 random(2026);
+    int sawNew = 0;
+    for (int round = 0; round < 60; ++round) {
+        const pid_t saver = ::fork();
+        ASSERT_GE(saver, 0);
+        if (saver == 0) {
+            for (;;) {
+                s.game.SoundOn = s.game.SoundOn == 1 ? 0 : 1;
+                SaveProgress(s.game);
+            }
+        }
+        ::usleep(static_cast<useconds_t>(random() % 8000));
+        ::kill(saver, SIGKILL);
+        int status = 0;
+        ASSERT_EQ(::waitpid(saver, &status, 0), saver);
+        const std::string now = ReadFile(file);
+        ASSERT_TRUE(now == kSaved || now == kSavedWithSoundOff) << "round " << round << ": \"" << now << "\"";
+        if (now == kSavedWithSoundOff) ++sawNew;
+    }
+    EXPECT_GT(sawNew, 0) << "the killed savers never got a save through";
+    ToggleSoundAndSave(s);
+    EXPECT_EQ(s.TakeOutput(), "") << "temporary files left by killed saves do not block saving";
+    EXPECT_EQ(ReadFile(file), kSavedWithSoundOff);
 }
 
 }  // namespace
