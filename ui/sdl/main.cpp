@@ -1,10 +1,12 @@
 #define SDL_MAIN_HANDLED
 #include <chrono>
 #include <exception>
+#include <iostream>
 
 #include "shell/game.h"
 #include "shell/startup.h"
 #include "ui/sdl/assets.h"
+#include "ui/sdl/display.h"
 #include "ui/sdl/game_window.h"
 #include "ui/sdl/handles.h"
 #include "ui/sdl/message_boxes.h"
@@ -26,6 +28,11 @@ int main()
     SDL_SetMainReady();
     try {
         const sdl::Subsystem video(SDL_INIT_VIDEO);
+        if (!sdl::HasDisplay()) {
+            // No window can show this.
+            std::cerr << "Kruszarka: nie znaleziono ekranu (ustaw DISPLAY) / no display found (set DISPLAY)\n";
+            return 1;
+        }
         const sdl::Assets assets = sdl::Assets::BesideExecutable();
         sdl::MixerSound sound(assets);
         sdl::SdlMessageBoxes messages;
