@@ -52,15 +52,20 @@ TEST(Pictures, OnlyRegularFilesAreDrawnAndAnythingElseIsReportedOnceLikeAMissing
     fs::create_directory(planted.Picture("hero"));
     ASSERT_EQ(::mkfifo(planted.Picture("icon").c_str(), 0644), 0);
     fs::create_symlink(fs::absolute(SourceAssets().Picture("object-0")), planted.Picture("object-0"));
+    std::ofstream(planted.Picture("object-1")) << "not a picture at all";
     const Assets assets = planted.assets();
 
     const std::string first = Reported([&] {
         EXPECT_EQ(RasterisePicture(assets, {ui::PictureSet::Hero, 0}, 1), nullptr);
         EXPECT_EQ(RasterisePicture(assets, {ui::PictureSet::WindowIcon, 0}, 2), nullptr);
         EXPECT_NE(RasterisePicture(assets, {ui::PictureSet::Object, 0}, 1), nullptr) << "a link to a picture is drawn";
+        EXPECT_EQ(RasterisePicture(assets, {ui::PictureSet::Object, 1}, 1), nullptr);
     });
-    EXPECT_EQ(first, "Kruszarka: cannot draw " + planted.Picture("hero").string() + ": not a regular file\n" +
-                         "Kruszarka: cannot draw " + planted.Picture("icon").string() + ": not a regular file\n");
+    const std::string refused = "Kruszarka: cannot draw " + planted.Picture("hero").string() + ": not a regular file\n" +
+                                "Kruszarka: cannot draw " + planted.Picture("icon").string() + ": not a regular file\n";
+    EXPECT_EQ(first.substr(0, refused.size()), refused);
+    EXPECT_EQ(first.substr(refused.size()).rfind("Kruszarka: cannot draw " + planted.Picture("object-1").string() + ": ", 0), 0u)
+        << first;
     const std::string again = Reported([&] { EXPECT_EQ(RasterisePicture(assets, {ui::PictureSet::Hero, 0}, 1), nullptr); });
     EXPECT_EQ(again, "");
 }
