@@ -94,12 +94,11 @@ ProgressRead ReadProgressFile(const std::filesystem::path& file)
     if (!S_ISREG(before.st_mode)) return Unreadable(kNotRegular);
     const Descriptor fd{::open(file.c_str(), O_RDONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC)};
     if (fd.get() < 0) return errno == ENOENT ? ProgressRead{} : Unreadable(Reason(errno));
-    // Swapped between the look and the open.
+    // What lies at the name may have been swapped between the look and the open.
     struct stat opened{};
     if (::fstat(fd.get(), &opened) != 0) return Unreadable(Reason(errno));
     if (!S_ISREG(opened.st_mode)) return Unreadable(kNotRegular);
 
-    ProgressRead result{ProgressRead::Status::Read, {}, {}};
     char buffer[kProgressFileLimit + 1];
     size_t size = 0;
     while (size < sizeof buffer) {
@@ -109,8 +108,7 @@ ProgressRead ReadProgressFile(const std::filesystem::path& file)
         else if (errno != EINTR) return Unreadable(Reason(errno));
     }
     if (size > kProgressFileLimit) return Unreadable("plik jest za duży");
-    result.text.assign(buffer, size);
-    return result;
+    return {ProgressRead::Status::Read, std::string(buffer, size), {}};
 }
 
 std::string ReplaceProgressFile(const std::filesystem::path& file, const std::string& text)
