@@ -33,6 +33,8 @@ public:
     Random random;
     Host host;
     std::filesystem::path progressFile;
+    // Why config.cfg could not be read at start-up; while set, the next save first moves that file aside.
+    std::string progressUnreadable;
     // Set by "Wyjście": the host ends the program at once.
     bool quitRequested = false;
 

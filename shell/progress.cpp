@@ -1,37 +1,15 @@
 #include "shell/progress.h"
 
-#include <fcntl.h>
-#include <unistd.h>
-
 #include <algorithm>
-#include <cerrno>
-#include <charconv>
-#include <fstream>
-#include <sstream>
-#include <system_error>
 
 #include "shell/game.h"
+#include "shell/progress_file.h"
+#include "shell/texts.h"
 
 namespace kr {
 namespace {
 
-std::array<int16_t*, 8> Fields(Progress& p)
-{
-    return {&p.UnlockedMissions, &p.SoundOn, &p.Strength, &p.Intelligence, &p.Dexterity, &p.Endurance, &p.Accuracy,
-            &p.TutorialOn};
-}
-
-bool IsBlank(char c) { return c == ' ' || c == '\t' || c == '\r' || c == '\n'; }
-bool EndsField(char c) { return c == ' ' || c == ',' || c == '\r' || c == '\n'; }
-
-std::optional<int16_t> ParseField(std::string_view text)
-{
-    if (!text.empty() && text.front() == '+') text.remove_prefix(1);
-    int16_t value = 0;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    if (error != std::errc() || end != text.data() + text.size() || text.empty()) return std::nullopt;
-    return value;
-}
+const std::string kSaveFailed = "Nie udało się zapisać postępów gry: ";
 
 Progress FromGame(const Game& g)
 {
@@ -42,51 +20,17 @@ Progress FromGame(const Game& g)
 int16_t Clamp(int16_t value, int16_t low, int16_t high) { return std::clamp(value, low, high); }
 int16_t Switch(int16_t value) { return value == 1 ? int16_t{1} : int16_t{0}; }
 
+std::string FileName(const Game& g) { return g.progressFile.filename().string(); }
+
 }  // namespace
-
-int ParseProgress(std::string_view text, Progress& into)
-{
-    size_t at = 0;
-    int read = 0;
-    for (int16_t* field : Fields(into)) {
-        while (at < text.size() && IsBlank(text[at])) ++at;
-        if (at >= text.size()) break;
-        const size_t start = at;
-        while (at < text.size() && !EndsField(text[at])) ++at;
-        const std::optional<int16_t> value = ParseField(text.substr(start, at - start));
-        if (!value) break;
-        *field = *value;
-        ++read;
-        // A comma closes the field; trailing spaces before it belong to the same separator.
-        size_t next = at;
-        while (next < text.size() && text[next] == ' ') ++next;
-        if (next < text.size() && text[next] == ',') at = next + 1;
-    }
-    return read;
-}
-
-std::string FormatProgress(const Progress& progress)
-{
-    Progress copy = progress;
-    std::string text;
-    for (const int16_t* field : Fields(copy)) {
-        const int value = *field;
-        text += value < 0 ? "-" : " ";
-        text += std::to_string(value < 0 ? -value : value);
-        text += " \r\n";
-    }
-    return text;
-}
 
 bool LoadProgress(Game& g)
 {
     Progress p = FromGame(g);
     int read = 0;
-    if (std::ifstream file{g.progressFile, std::ios::binary}) {
-        std::ostringstream text;
-        text << file.rdbuf();
-        read = ParseProgress(text.str(), p);
-    }
+    const ProgressRead file = ReadProgressFile(g.progressFile);
+    if (file.status == ProgressRead::Status::Read) read = ParseProgress(file.text, p);
+    if (file.status == ProgressRead::Status::Unreadable) g.progressUnreadable = file.reason;
     const bool complete = read == 8;
     if (!complete) p.UnlockedMissions = 1;
     // Hand-edited files may hold anything: keep values where no later rule can overflow or lock up.
@@ -101,37 +45,28 @@ bool LoadProgress(Game& g)
     return complete;
 }
 
-namespace {
-
-// Writes the whole text and forces it to the disk, so that the rename that follows can never expose an
-// empty or partial file, even after a power cut.
-bool WriteDurably(const std::filesystem::path& file, const std::string& text)
+std::string LoadFailureMessage(const Game& g)
 {
-    const int fd = ::open(file.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0644);
-    if (fd < 0) return false;
-    bool written = true;
-    for (size_t done = 0; written && done < text.size();) {
-        const ssize_t n = ::write(fd, text.data() + done, text.size() - done);
-        if (n > 0) done += static_cast<size_t>(n);
-        else written = n < 0 && errno == EINTR;
-    }
-    written = written && ::fsync(fd) == 0;
-    return ::close(fd) == 0 && written;
+    if (g.progressUnreadable.empty()) return kMissingProgressMessage;
+    return "Nie można odczytać pliku konfiguracyjnego " + FileName(g) + ": " + g.progressUnreadable +
+           ".\nGra zaczyna od pierwszej misji; przed następnym zapisem ten plik zostanie zachowany jako " + FileName(g) +
+           ".bak.";
 }
-
-}  // namespace
 
 void SaveProgress(Game& g)
 {
-    std::filesystem::path temporary = g.progressFile;
-    temporary += ".tmp";
-    std::error_code error;
-    if (!WriteDurably(temporary, FormatProgress(FromGame(g)))) {
-        std::filesystem::remove(temporary, error);
-        return;
+    if (!g.progressUnreadable.empty()) {
+        // What could not be read may still be the player's: set it aside rather than write over it.
+        const MovedAside moved = MoveAside(g.progressFile);
+        if (!moved.error.empty()) {
+            g.host.messages.ShowOk(kSaveFailed + "nie można przenieść nieczytelnego pliku " + FileName(g) + " na bok (" +
+                                   moved.error + ")");
+            return;
+        }
+        g.progressUnreadable.clear();
     }
-    std::filesystem::rename(temporary, g.progressFile, error);
-    if (error) std::filesystem::remove(temporary, error);
+    const std::string error = ReplaceProgressFile(g.progressFile, FormatProgress(FromGame(g)));
+    if (!error.empty()) g.host.messages.ShowOk(kSaveFailed + error);
 }
 
 }  // namespace kr

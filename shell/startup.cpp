@@ -25,7 +25,7 @@ void StartUp(Game& g, uint32_t seed)
     OpenSoundChannels(g);
     FillSkillCost(g);
 
-    if (!LoadProgress(g)) g.host.messages.ShowOk(kMissingProgressMessage);
+    if (!LoadProgress(g)) g.host.messages.ShowOk(LoadFailureMessage(g));
 
     g.screen.MainMenuScreen->left = 2280;
     g.screen.MainMenuScreen->top = 960;

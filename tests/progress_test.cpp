@@ -39,6 +39,12 @@ TEST(ProgressFile, ReadsFieldsSeparatedBySpacesCommasAndLineEnds)
     Progress r;
     EXPECT_EQ(ParseProgress(" 5 \r\n 1 \r\n x \r\n", r), 2) << "a field that does not convert ends the read";
     EXPECT_EQ(ParseProgress(" 5 \r\n 40000 \r\n", r), 1) << "a value past 16 bits is a failed read";
+    EXPECT_EQ(ParseProgress("-32768 +32767 +7 -0", r), 4);
+    EXPECT_EQ(r.UnlockedMissions, -32768);
+    EXPECT_EQ(r.SoundOn, 32767);
+    EXPECT_EQ(r.Strength, 7);
+    for (const char* field : {"+-7", "-+7", "++7", "--7", "+", "-", "7-", "0x7", "-99999999999999999999"})
+        EXPECT_EQ(ParseProgress(field, r), 0) << "a sign is one character followed by digits: " << field;
 }
 
 TEST(ProgressFile, MissingFileReportsOnceAndLeavesANewPlayer)
@@ -79,21 +85,32 @@ TEST(ProgressFile, PartialAndOddFilesAreReadAsFarAsTheyGoThenKeptInRange)
               "\"MOC:          0\\r\\nZRĘCZNOŚĆ:    1\\r\\nCELNOŚĆ:      0\\r\\nWYTRZYMAŁOŚĆ: 2\\r\\nINTELIGENCJA: 10\"");
 }
 
-TEST(ProgressFile, AFailedSaveLeavesTheOldFileWholeAndTheGameRunning)
+TEST(ProgressFile, AFailedSaveIsToldEachTimeLeavesTheOldFileWholeAndTheGameRunning)
 {
-    Session s(3, " 4 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n");
-    // A folder where the temporary file should go makes the write fail.
-    std::filesystem::create_directory(s.folder().File("config.cfg.tmp"));
+    const std::string saved = " 4 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n";
+    Session s(3, saved);
+    // A folder standing where config.cfg should be makes the final rename fail.
+    const std::filesystem::path file = s.folder().File("config.cfg");
+    std::filesystem::rename(file, s.folder().File("kept"));
+    std::filesystem::create_directories(file / "inside");
     s.Click("\"Opcje\"");
     s.Click("Check1");
     s.Click("\"Powrót\"");
-    EXPECT_EQ(ReadFile(s.folder().File("config.cfg")), " 4 \r\n 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n");
+    EXPECT_EQ(s.TakeOutput(), "message: Nie udało się zapisać postępów gry: Is a directory\n");
     EXPECT_TRUE(s.game.screen.MainMenuScreen->visible);
-    std::filesystem::remove(s.folder().File("config.cfg.tmp"));
+    EXPECT_TRUE(std::filesystem::is_directory(file / "inside"));
     s.Click("\"Opcje\"");
     s.Click("\"Powrót\"");
-    EXPECT_EQ(ReadFile(s.folder().File("config.cfg")), " 4 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n");
-    EXPECT_FALSE(std::filesystem::exists(s.folder().File("config.cfg.tmp")));
+    EXPECT_EQ(s.TakeOutput(), "message: Nie udało się zapisać postępów gry: Is a directory\n") << "told once per save";
+
+    std::filesystem::remove_all(file);
+    s.Click("\"Opcje\"");
+    s.Click("\"Powrót\"");
+    EXPECT_EQ(s.TakeOutput(), "");
+    EXPECT_EQ(ReadFile(file), " 4 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 1 \r\n");
+    int files = 0;
+    for ([[maybe_unused]] const auto& entry : std::filesystem::directory_iterator(s.folder().path())) ++files;
+    EXPECT_EQ(files, 2) << "no temporary file is left behind by failed saves";
 }
 
 TEST(ProgressFile, ResetAskedWithNoKeepsEverythingAndYesSavesAtOnce)

@@ -51,6 +51,13 @@ Session::Session(uint32_t seed, const std::string& progress)
     Must("start");
 }
 
+Session::Session(uint32_t seed, const std::function<void(const TempFolder&)>& plant)
+    : runner_(out_, seed, {}, folder_.File("config.cfg")), game(runner_.game())
+{
+    plant(folder_);
+    Must("start");
+}
+
 int Session::Run(const std::string& lines)
 {
     std::istringstream in(lines);

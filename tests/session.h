@@ -36,6 +36,8 @@ class Session {
 
 public:
     explicit Session(uint32_t seed = 7, const std::string& progress = " 1 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n");
+    // Starts after `plant` has put whatever it likes into the working folder.
+    Session(uint32_t seed, const std::function<void(const TempFolder&)>& plant);
 
     // Runs scenario lines; returns the runner's exit code (0 unless an expect failed or a line was bad).
     int Run(const std::string& lines);

@@ -4,6 +4,8 @@
 #include <stdexcept>
 #include <string>
 
+#include "ui/sdl/regular_file.h"
+
 namespace kr::sdl {
 namespace {
 
@@ -39,7 +41,8 @@ TTF_Font* Fonts::Get(const ui::Font& font)
     const auto found = open_.find(key);
     if (found != open_.end()) return found->second.get();
     const char* file = FileOf(font.face, font.bold);
-    FontPtr opened{TTF_OpenFontDPI(file, pixels, 72, 72)};
+    SDL_RWops* const stream = OpenRegularFile(file);
+    FontPtr opened{stream ? TTF_OpenFontDPIRW(stream, 1, pixels, 72, 72) : nullptr};
     if (!opened) throw std::runtime_error(std::string("Fonts::Get: ") + file + ": " + TTF_GetError());
     return open_.emplace(key, std::move(opened)).first->second.get();
 }

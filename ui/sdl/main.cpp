@@ -10,6 +10,7 @@
 #include "shell/startup.h"
 #include "ui/sdl/assets.h"
 #include "ui/sdl/data_check.h"
+#include "ui/sdl/display.h"
 #include "ui/sdl/game_window.h"
 #include "ui/sdl/handles.h"
 #include "ui/sdl/message_boxes.h"
@@ -59,6 +60,11 @@ int main(int argc, char** argv)
     try {
         if (userFolder) EnterUserFolder();
         const sdl::Subsystem video(SDL_INIT_VIDEO);
+        if (!sdl::HasDisplay()) {
+            // No window can show this.
+            std::cerr << "Kruszarka: nie znaleziono ekranu (ustaw DISPLAY) / no display found (set DISPLAY)\n";
+            return 1;
+        }
         const sdl::Assets assets = sdl::Assets::BesideExecutable();
         sdl::MixerSound sound(assets, sdl::GameWindow::RealClock());
         sdl::SdlMessageBoxes messages;

@@ -6,6 +6,8 @@
 #include <set>
 #include <string>
 
+#include "ui/sdl/regular_file.h"
+
 namespace kr::sdl {
 namespace {
 
@@ -25,7 +27,7 @@ SurfacePtr RasterisePicture(const Assets& assets, ui::PictureRef picture, int sc
     const std::optional<ui::PixelSize> size = ui::SizeOf(picture);
     if (!size) return nullptr;
     const std::string file = assets.Picture(ui::FileStem(picture)).string();
-    SDL_RWops* stream = SDL_RWFromFile(file.c_str(), "rb");
+    SDL_RWops* stream = OpenRegularFile(file);
     if (!stream) {
         ReportOnce(file, SDL_GetError());
         return nullptr;

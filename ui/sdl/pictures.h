@@ -10,7 +10,7 @@
 namespace kr::sdl {
 
 // Rasterises the picture's SVG at its 1x size times `scale`; nullptr (and one line on stderr per file)
-// when the file is missing or unreadable.
+// when the file is missing, unreadable or not a regular file.
 SurfacePtr RasterisePicture(const Assets& assets, ui::PictureRef picture, int scale);
 
 // The textures of the game's pictures for one renderer, each rasterised once per scale.
