@@ -5,6 +5,7 @@
 #include <optional>
 
 #include "shell/game.h"
+#include "tools/record.h"
 #include "ui/sdl/assets.h"
 #include "ui/sdl/cursors.h"
 #include "ui/sdl/form_renderer.h"
@@ -44,13 +45,17 @@ public:
     // Draws and presents when the frame's signature changed (or the window was exposed); true if it did.
     bool Redraw();
 
+    // From now on every input reaches the game through `recorder`, which writes it down; nullptr stops that.
+    void Record(record::Recorder* recorder) { recorder_ = recorder; }
+
     uint64_t FramesPresented() const { return framesPresented_; }
     uint64_t Rasterised() const { return form_->Rasterised(); }
 
     static Clock RealClock();
 
 private:
-    void Mouse(int x, int y, void (ui::Form::*deliver)(float, float));
+    void Mouse(record::InputKind kind, int x, int y);
+    void Deliver(const record::Input& input);
     // The game's time at this clock reading, less what the game did not see.
     double GameTime(double clockMs);
 
@@ -64,6 +69,7 @@ private:
     uint64_t framesPresented_ = 0;
     std::optional<double> offset_;  // game time minus clock time
     std::string title_;
+    record::Recorder* recorder_ = nullptr;
 };
 
 }  // namespace kr::sdl
