@@ -129,21 +129,25 @@ private:
         }
         const Screen& s = game_.ui;
         const int roll = Roll(100);
-        if (roll < 40) {
+        if (roll < 60) {
             const auto swaps = MatchingSwaps(game_.Board);
             if (!swaps.empty()) {
+                // A player sees the green outline of a cell left selected and lets go of it first.
+                if (s.SelectionMarker->visible && game_.SelectedCell > 0 && Roll(10))
+                    Click(*s.Cells[static_cast<size_t>(game_.SelectedCell)]);
                 const auto [from, to] = Pick(swaps);
                 Swap(from, to);
                 return;
             }
         }
-        if (roll < 50) {
+        // Swaps that line up nothing cost a third of the health: rare enough that missions get won.
+        if (roll < 63) {
             const int16_t from = static_cast<int16_t>(11 + 10 * Roll(8) + Roll(8));
             const int16_t to = static_cast<int16_t>(from + (Roll(2) ? 1 : 10));
             Swap(from, to);
-        } else if (roll < 60) {
+        } else if (roll < 68) {
             Click(*s.Cells[static_cast<size_t>(Roll(100))]);
-        } else if (roll < 72) {
+        } else if (roll < 76) {
             const int which = Roll(3);
             const ui::Control* skill = which == 0   ? s.SkillFrames[static_cast<size_t>(Roll(7))]
                                        : which == 1 ? s.SkillIcons[static_cast<size_t>(Roll(7))]
@@ -151,12 +155,11 @@ private:
             Click(*skill);
             // A targeting skill waits for its board press.
             if (Roll(2)) Click(*s.Cells[static_cast<size_t>(11 + 10 * Roll(8) + Roll(8))]);
-        } else if (roll < 79) {
+        } else if (roll < 80) {
             const int key = Roll(10);
             Key(key < 5 ? kEscape : key < 9 ? kKeyN : kKeyT);
         } else if (roll < 92) {
-            const auto& all = game_.form.All();
-            Move(*Pick(all));
+            Move(*Pick(game_.form.All()));
         } else {
             const float x = static_cast<float>(Roll(8640)), y = static_cast<float>(Roll(6705));
             Deliver({record::InputKind::Press, x, y});
