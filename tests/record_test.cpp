@@ -6,6 +6,7 @@
 #include "shell/startup.h"
 #include "tests/session.h"
 #include "tools/record.h"
+#include "tools/record_file.h"
 #include "tools/script.h"
 #include "ui/headless.h"
 
@@ -92,6 +93,28 @@ TEST(Recorder, WritesWhatAReplayNeedsAndNothingElse)
     ASSERT_EQ(runner.Run(in), 0) << out.str();
     EXPECT_EQ(replayTrace, "down click over45 background over45 ");
     EXPECT_EQ(record::Snapshot(runner.game()), record::Snapshot(g));
+}
+
+// A recording never lands on anything that already has its name: not a file, not a link.
+TEST(Recorder, WritesOnlyToAFreshFile)
+{
+    testing::TempFolder folder;
+    std::string error;
+    const std::filesystem::path fresh = folder.File("fresh.script");
+    std::optional<record::Recorder::Sink> sink = record::RecordingFile(fresh, error);
+    ASSERT_TRUE(sink) << error;
+    (*sink)("seed 1\n");
+    (*sink)("start\n");
+    EXPECT_EQ(testing::ReadFile(fresh), "seed 1\nstart\n");
+
+    EXPECT_FALSE(record::RecordingFile(fresh, error));
+    EXPECT_NE(error.find("already exists"), std::string::npos) << error;
+    EXPECT_EQ(testing::ReadFile(fresh), "seed 1\nstart\n");
+
+    const std::filesystem::path link = folder.File("link.script");
+    std::filesystem::create_symlink(folder.File("elsewhere.txt"), link);
+    EXPECT_FALSE(record::RecordingFile(link, error));
+    EXPECT_FALSE(std::filesystem::exists(folder.File("elsewhere.txt"))) << "nothing was created through the link";
 }
 
 }  // namespace

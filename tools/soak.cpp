@@ -25,6 +25,7 @@ struct Broken : std::runtime_error {
 
 constexpr int kEscape = 27, kKeyT = 84, kKeyN = 78;
 
+// The random player and the game it plays, recorded from start-up.
 class Player {
 public:
     Player(uint32_t seed, const std::filesystem::path& progress, std::string& script)
@@ -32,6 +33,7 @@ public:
           recorder_(game_, answers_, [&script](const std::string& lines) { script += lines; }),
           random_(seed ^ 0x9e3779b9u)
     {
+        // Each tick is checked as it ends, so ticks due at the same moment are told apart.
         for (int timer = 1; timer <= ui::TimerBank::kCount; ++timer) {
             ui::Timer& t = game_.timers[timer];
             t.onTick = [this, inner = std::move(t.onTick)] {
