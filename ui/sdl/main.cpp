@@ -7,12 +7,12 @@
 
 #include "shell/game.h"
 #include "shell/startup.h"
+#include "tools/record.h"
+#include "tools/record_file.h"
 #include "ui/sdl/assets.h"
 #include "ui/sdl/game_window.h"
 #include "ui/sdl/handles.h"
 #include "ui/sdl/message_boxes.h"
-#include "tools/record.h"
-#include "tools/record_file.h"
 #include "ui/sdl/mixer_sound.h"
 
 namespace {
