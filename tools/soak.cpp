@@ -88,6 +88,8 @@ private:
 
     void Deliver(const record::Input& input)
     {
+        // Time passed since the last tick: the rules see the moment the input arrives, too.
+        Check();
         recorder_.Handle(input);
         ++tally_.inputs;
         Check();
