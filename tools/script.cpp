@@ -28,21 +28,18 @@ std::pair<std::string, std::string> Verb(const std::string& line)
     return {line.substr(0, space), Trim(line.substr(space))};
 }
 
-int64_t ParseWhole(const std::string& text)
+// The whole text as one number, or a ScriptError saying what it should have been.
+template <typename Number>
+Number Parse(const std::string& text, const char* expected)
 {
-    int64_t value = 0;
+    Number value{};
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    if (error != std::errc() || end != text.data() + text.size()) throw ScriptError("not a number: " + text);
+    if (error != std::errc() || end != text.data() + text.size()) throw ScriptError(expected + (": " + text));
     return value;
 }
 
-float ParseTwips(const std::string& text)
-{
-    float value = 0;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    if (error != std::errc() || end != text.data() + text.size()) throw ScriptError("not a position: " + text);
-    return value;
-}
+int64_t ParseWhole(const std::string& text) { return Parse<int64_t>(text, "not a number"); }
+float ParseTwips(const std::string& text) { return Parse<float>(text, "not a position"); }
 
 std::string StripComment(const std::string& line)
 {
