@@ -94,5 +94,27 @@ TEST(Replays, TheScenarioLanguageReportsFailuresAndBadLines)
               "#40123401#\n#01234012#\n#12340123#\n#23401234#\n##########\n");
 }
 
+// A recording names a control whose centre another control covers by the point that was pressed, and a
+// press that already ran its handler finishes as a click with a bare release.
+TEST(Replays, PointsAndReleasesReachTheControlsTheyName)
+{
+    testing::Session s;
+    const ui::Rect gra = s.game.form.Bounds(*s.game.screen.PlayButton);
+    EXPECT_EQ(s.Run("press Command1\nexpect MainMenuScreen.Visible True\nrelease Command2\n"
+                    "expect MainMenuScreen.Visible True\n"),
+              0)
+        << "a release over another control is no click";
+    EXPECT_EQ(s.Run("press Command1\nrelease Command1\nexpect MissionMenuScreen.Visible True\nrelease Command5\n"
+                    "expect MissionMenuScreen.Visible True\n"),
+              0)
+        << "a release with nothing pressed is no click";
+    EXPECT_EQ(s.Run("click Command5\nclick @" + std::to_string(static_cast<int>(gra.left + 1)) + "," +
+                    std::to_string(static_cast<int>(gra.top + gra.height - 1)) +
+                    "  # the corner of \"Gra\"\nexpect MissionMenuScreen.Visible True\n"),
+              0);
+    EXPECT_EQ(s.Run("click @12,x\n"), 2);
+    EXPECT_EQ(s.Run("move @12\n"), 2);
+}
+
 }  // namespace
 }  // namespace kr

@@ -28,13 +28,18 @@ std::pair<std::string, std::string> Verb(const std::string& line)
     return {line.substr(0, space), Trim(line.substr(space))};
 }
 
-int64_t ParseWhole(const std::string& text)
+// The whole text as one number, or a ScriptError saying what it should have been.
+template <typename Number>
+Number Parse(const std::string& text, const char* expected)
 {
-    int64_t value = 0;
+    Number value{};
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    if (error != std::errc() || end != text.data() + text.size()) throw ScriptError("not a number: " + text);
+    if (error != std::errc() || end != text.data() + text.size()) throw ScriptError(expected + (": " + text));
     return value;
 }
+
+int64_t ParseWhole(const std::string& text) { return Parse<int64_t>(text, "not a number"); }
+float ParseTwips(const std::string& text) { return Parse<float>(text, "not a position"); }
 
 std::string StripComment(const std::string& line)
 {
@@ -91,7 +96,7 @@ std::optional<int> ScriptRunner::Execute(const std::string& line, std::istream& 
         else if (rest == "yes") messages_.Queue(ui::ScriptedMessages::Answer::Yes);
         else if (rest == "no") messages_.Queue(ui::ScriptedMessages::Answer::No);
         else throw ScriptError("answer takes ok, yes or no");
-    } else if (verb == "click" || verb == "press" || verb == "move") {
+    } else if (verb == "click" || verb == "press" || verb == "release" || verb == "move") {
         Deliver(verb, rest);
     } else if (verb == "key") {
         // "key 9 shift" is Shift+Tab.
@@ -144,7 +149,26 @@ std::optional<int> ScriptRunner::Execute(const std::string& line, std::istream& 
 void ScriptRunner::Deliver(const std::string& verb, const std::string& target)
 {
     ui::Form& form = game_->form;
-    ui::Control* control = nullptr;
+    const auto [x, y] = Aim(target);
+    if (verb == "move") {
+        form.MouseMove(x, y);
+    } else if (verb == "release") {
+        form.MouseUp(x, y);
+    } else {
+        form.MouseDown(x, y);
+        if (verb == "click") form.MouseUp(x, y);
+    }
+}
+
+std::pair<float, float> ScriptRunner::Aim(const std::string& target) const
+{
+    const ui::Form& form = game_->form;
+    if (!target.empty() && target.front() == '@') {
+        const size_t comma = target.find(',');
+        if (comma == std::string::npos) throw ScriptError("a point is @X,Y in twips");
+        return {ParseTwips(target.substr(1, comma - 1)), ParseTwips(target.substr(comma + 1))};
+    }
+    const ui::Control* control = nullptr;
     if (target.size() >= 2 && target.front() == '"' && target.back() == '"') {
         control = form.FindByCaption(target.substr(1, target.size() - 2));
         if (!control) throw ScriptError("no visible control with caption " + target);
@@ -153,14 +177,7 @@ void ScriptRunner::Deliver(const std::string& verb, const std::string& target)
         if (!control) throw ScriptError("unknown control: " + target);
     }
     const ui::Rect bounds = form.Bounds(*control);
-    const float x = bounds.left + bounds.width / 2;
-    const float y = bounds.top + bounds.height / 2;
-    if (verb == "move") {
-        form.MouseMove(x, y);
-        return;
-    }
-    form.MouseDown(x, y);
-    if (verb == "click") form.MouseUp(x, y);
+    return {bounds.left + bounds.width / 2, bounds.top + bounds.height / 2};
 }
 
 std::string ScriptRunner::Print(const std::string& name) const
@@ -199,22 +216,24 @@ void ScriptRunner::SetBoard(std::istream& in)
     }
 }
 
-void ScriptRunner::Dump()
+void ScriptRunner::Dump() { out_ << DumpBoard(*game_); }
+
+std::string DumpBoard(const Game& g)
 {
-    const Game& g = *game_;
+    std::string text;
     for (int row = 0; row < 10; ++row) {
-        std::string line;
         for (int column = 0; column < 10; ++column) {
             const size_t i = static_cast<size_t>(row * 10 + column);
             const int16_t value = g.Board[i];
-            if (value == BORDER) line += '#';
-            else if (value == CLEARED) line += '.';
-            else if (value == kBrownBullet && g.GreenFlag[i]) line += 'g';
-            else if (IsGem(value)) line += static_cast<char>('0' + value);
-            else line += '?';
+            if (value == BORDER) text += '#';
+            else if (value == CLEARED) text += '.';
+            else if (value == kBrownBullet && g.GreenFlag[i]) text += 'g';
+            else if (IsGem(value)) text += static_cast<char>('0' + value);
+            else text += '?';
         }
-        out_ << line << '\n';
+        text += '\n';
     }
+    return text;
 }
 
 }  // namespace kr::script

@@ -7,6 +7,7 @@
 #include <optional>
 #include <ostream>
 #include <string>
+#include <utility>
 
 #include "shell/game.h"
 #include "ui/headless.h"
@@ -15,6 +16,9 @@ namespace kr::script {
 
 // Writes a PNG of the window as a player would see it; false when it could not.
 using ScreenshotWriter = std::function<bool(const Game&, const std::string& file)>;
+
+// The 10 x 10 board as `dump` prints it: `#` border, `.` cleared, digits, `g` green-tipped, one row a line.
+std::string DumpBoard(const Game& g);
 
 // The scenario language: drives the real game headless under a virtual clock.
 // Exit codes: 0 at the end, 1 at the first failed expect, 2 on a line it cannot understand.
@@ -31,6 +35,8 @@ private:
     // Runs one line; returns an exit code when the script must stop there.
     std::optional<int> Execute(const std::string& line, std::istream& in);
     void Deliver(const std::string& verb, const std::string& target);
+    // The window point a target names: a control's centre, or "@X,Y" in twips.
+    std::pair<float, float> Aim(const std::string& target) const;
     std::string Print(const std::string& name) const;
     void SetBoard(std::istream& in);
     void Dump();

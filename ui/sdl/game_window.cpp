@@ -117,9 +117,15 @@ void GameWindow::Tick(double clockMs)
     game_.timers.AdvanceTo(static_cast<int64_t>(std::floor(GameTime(clockMs))));
 }
 
-void GameWindow::Mouse(int x, int y, void (ui::Form::*deliver)(float, float))
+void GameWindow::Mouse(record::InputKind kind, int x, int y)
 {
-    (game_.form.*deliver)(PixelToTwips(x), PixelToTwips(y));
+    Deliver({kind, PixelToTwips(x), PixelToTwips(y)});
+}
+
+void GameWindow::Deliver(const record::Input& input)
+{
+    if (recorder_) recorder_->Handle(input);
+    else record::Deliver(game_.form, input);
 }
 
 bool GameWindow::Handle(const SDL_Event& event)
@@ -129,17 +135,17 @@ bool GameWindow::Handle(const SDL_Event& event)
         return false;
     case SDL_MOUSEBUTTONDOWN:
         // Board cells and skills answer a press of any button; only the left one goes on to a click.
-        Mouse(event.button.x, event.button.y, &ui::Form::MouseDown);
+        Mouse(record::InputKind::Press, event.button.x, event.button.y);
         break;
     case SDL_MOUSEBUTTONUP:
-        if (event.button.button == SDL_BUTTON_LEFT) Mouse(event.button.x, event.button.y, &ui::Form::MouseUp);
+        if (event.button.button == SDL_BUTTON_LEFT) Mouse(record::InputKind::Release, event.button.x, event.button.y);
         break;
     case SDL_MOUSEMOTION:
-        Mouse(event.motion.x, event.motion.y, &ui::Form::MouseMove);
+        Mouse(record::InputKind::Move, event.motion.x, event.motion.y);
         break;
     case SDL_KEYDOWN:
         if (const std::optional<int> code = GameKeyCode(event.key.keysym.sym))
-            game_.form.KeyDown(*code, ShiftHeld(event.key.keysym.mod));
+            Deliver({record::InputKind::Key, 0, 0, *code, ShiftHeld(event.key.keysym.mod)});
         break;
     case SDL_WINDOWEVENT:
         // The window's pixels were lost or resized: the next Redraw must draw even an unchanged frame.

@@ -5,6 +5,7 @@
 #include <optional>
 
 #include "shell/game.h"
+#include "tools/record.h"
 #include "ui/sdl/assets.h"
 #include "ui/sdl/cursors.h"
 #include "ui/sdl/form_renderer.h"
@@ -45,6 +46,9 @@ public:
     // Draws and presents when the frame's signature changed (or the window was exposed); true if it did.
     bool Redraw();
 
+    // From now on every input reaches the game through `recorder`, which writes it down; nullptr stops that.
+    void Record(record::Recorder* recorder) { recorder_ = recorder; }
+
     uint64_t FramesPresented() const { return framesPresented_; }
     uint64_t Rasterised() const { return form_->Rasterised(); }
 
@@ -57,7 +61,8 @@ public:
     void SetChore(Chore chore) { chore_ = std::move(chore); }
 
 private:
-    void Mouse(int x, int y, void (ui::Form::*deliver)(float, float));
+    void Mouse(record::InputKind kind, int x, int y);
+    void Deliver(const record::Input& input);
     // The game's time at this clock reading, less what the game did not see.
     double GameTime(double clockMs);
 
@@ -72,6 +77,7 @@ private:
     std::optional<double> offset_;  // game time minus clock time
     std::string title_;
     Chore chore_;
+    record::Recorder* recorder_ = nullptr;
 };
 
 }  // namespace kr::sdl

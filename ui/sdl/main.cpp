@@ -3,11 +3,15 @@
 #include <cstdlib>
 #include <exception>
 #include <iostream>
+#include <optional>
 #include <stdexcept>
+#include <string>
 #include <string_view>
 
 #include "shell/game.h"
 #include "shell/startup.h"
+#include "tools/record.h"
+#include "tools/record_file.h"
 #include "ui/sdl/assets.h"
 #include "ui/sdl/data_check.h"
 #include "ui/sdl/display.h"
@@ -20,9 +24,10 @@
 namespace {
 
 constexpr const char* kUsage =
-    "usage: kruszarka [--user-folder] [--check-data]\n"
+    "usage: kruszarka [--user-folder] [--check-data] [--record FILE]\n"
     "  --user-folder  keep progress in $XDG_DATA_HOME/kruszarka (~/.local/share/kruszarka), not here\n"
-    "  --check-data   load every picture, sound and font, name what is missing, and exit\n";
+    "  --check-data   load every picture, sound and font, name what is missing, and exit\n"
+    "  --record FILE  write the seed and every input to FILE, a script kruszarka-script replays\n";
 
 uint32_t SeedFromClock()
 {
@@ -45,18 +50,29 @@ void EnterUserFolder()
 int main(int argc, char** argv)
 {
     using namespace kr;
-    SDL_SetMainReady();
     bool userFolder = false;
     bool checkData = false;
+    std::optional<record::Recorder::Sink> recording;
     for (int i = 1; i < argc; ++i) {
         const std::string_view option = argv[i];
-        if (option == "--user-folder") userFolder = true;
-        else if (option == "--check-data") checkData = true;
-        else {
+        if (option == "--user-folder") {
+            userFolder = true;
+        } else if (option == "--check-data") {
+            checkData = true;
+        } else if (option == "--record" && i + 1 < argc && !recording) {
+            // Opened before anything else, relative to the folder the game was started from.
+            std::string error;
+            recording = record::RecordingFile(argv[++i], error);
+            if (!recording) {
+                std::cerr << "kruszarka: cannot record: " << error << '\n';
+                return 2;
+            }
+        } else {
             std::cerr << kUsage;
             return 2;
         }
     }
+    SDL_SetMainReady();
     try {
         if (userFolder) EnterUserFolder();
         const sdl::Subsystem video(SDL_INIT_VIDEO);
@@ -68,14 +84,22 @@ int main(int argc, char** argv)
         const sdl::Assets assets = sdl::Assets::BesideExecutable();
         sdl::MixerSound sound(assets, sdl::GameWindow::RealClock());
         sdl::SdlMessageBoxes messages;
-        Game game{Host{messages, sound}};
+        record::AnswerLog answers(messages);
+        Game game{Host{recording ? static_cast<ui::MessageBoxes&>(answers) : messages, sound}};
         sdl::GameWindow gameWindow(game, assets, sdl::ChooseScale());
         if (checkData) {
             gameWindow.Redraw();
             return sdl::CheckGameData(assets, gameWindow.Scale(), std::cout) ? 0 : 1;
         }
         messages.SetParent(gameWindow.Handle());
-        StartUp(game, SeedFromClock());
+        const uint32_t seed = SeedFromClock();
+        StartUp(game, seed);
+        std::optional<record::Recorder> recorder;
+        if (recording) {
+            recorder.emplace(game, answers, *recording);
+            recorder->Started(seed);
+            gameWindow.Record(&*recorder);
+        }
         if (game.quitRequested) return 0;
         gameWindow.Show();
         gameWindow.Redraw();
