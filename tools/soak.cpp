@@ -33,7 +33,9 @@ public:
           recorder_(game_, answers_, [&script](const std::string& lines) { script += lines; }),
           random_(seed ^ 0x9e3779b9u)
     {
-        // Each tick is checked as it ends, so ticks due at the same moment are told apart.
+        StartUp(game_, seed);
+        // Each tick is checked as it ends, so ticks due at the same moment are told apart. The start-up has
+        // connected the game's handlers by now: these wrap them.
         for (int timer = 1; timer <= ui::TimerBank::kCount; ++timer) {
             ui::Timer& t = game_.timers[timer];
             t.onTick = [this, inner = std::move(t.onTick)] {
@@ -41,7 +43,6 @@ public:
                 Check();
             };
         }
-        StartUp(game_, seed);
         recorder_.Started(seed);
         Check();
     }
