@@ -28,9 +28,9 @@ bool LoadProgress(Game& g)
 {
     Progress p = FromGame(g);
     int read = 0;
-    const ProgressRead file = ReadProgressFile(g.progressFile);
-    if (file.status == ProgressRead::Status::Read) read = ParseProgress(file.text, p);
-    if (file.status == ProgressRead::Status::Unreadable) g.progressUnreadable = file.reason;
+    const ui::FileRead file = ReadProgressFile(g.progressFile);
+    if (file.status == ui::FileRead::Status::Read) read = ParseProgress(file.bytes, p);
+    if (file.status == ui::FileRead::Status::Unreadable) g.progressUnreadable = file.reason;
     const bool complete = read == 8;
     if (!complete) p.UnlockedMissions = 1;
     // Hand-edited files may hold anything: keep values where no later rule can overflow or lock up.

@@ -14,32 +14,6 @@ namespace {
 
 std::string Reason(int error) { return std::system_category().message(error); }
 
-ProgressRead Unreadable(std::string reason) { return {ProgressRead::Status::Unreadable, {}, std::move(reason)}; }
-
-// Closes a descriptor on every way out of the function that opened it.
-class Descriptor {
-public:
-    explicit Descriptor(int fd) : fd_(fd) {}
-    ~Descriptor()
-    {
-        if (fd_ >= 0) ::close(fd_);
-    }
-    Descriptor(const Descriptor&) = delete;
-    Descriptor& operator=(const Descriptor&) = delete;
-    int get() const { return fd_; }
-    // Closes now, so that a failed close can be told; returns errno or 0.
-    int Close()
-    {
-        const int result = ::close(fd_);
-        fd_ = -1;
-        return result == 0 ? 0 : errno;
-    }
-
-private:
-    int fd_;
-};
-
-const char* kNotRegular = "to nie jest zwykły plik";
 
 // A name no one has used: a planted file or link at a guessable name can neither be followed nor block saving.
 std::filesystem::path FreshTemporaryName(const std::filesystem::path& file)
@@ -68,7 +42,7 @@ int WriteAll(int fd, const std::string& text)
 void SyncFolder(const std::filesystem::path& file)
 {
     const std::filesystem::path folder = file.has_parent_path() ? file.parent_path() : ".";
-    const Descriptor fd{::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC)};
+    const ui::Descriptor fd{::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC)};
     if (fd.get() >= 0) ::fsync(fd.get());
 }
 
@@ -85,31 +59,7 @@ int RenameNoReplace(const std::filesystem::path& from, const std::filesystem::pa
 
 }  // namespace
 
-ProgressRead ReadProgressFile(const std::filesystem::path& file)
-{
-    // Looked at before opening, so a device or a FIFO is never opened at all.
-    struct stat before{};
-    if (::stat(file.c_str(), &before) != 0)
-        return errno == ENOENT ? ProgressRead{} : Unreadable(Reason(errno));
-    if (!S_ISREG(before.st_mode)) return Unreadable(kNotRegular);
-    const Descriptor fd{::open(file.c_str(), O_RDONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC)};
-    if (fd.get() < 0) return errno == ENOENT ? ProgressRead{} : Unreadable(Reason(errno));
-    // What lies at the name may have been swapped between the look and the open.
-    struct stat opened{};
-    if (::fstat(fd.get(), &opened) != 0) return Unreadable(Reason(errno));
-    if (!S_ISREG(opened.st_mode)) return Unreadable(kNotRegular);
-
-    char buffer[kProgressFileLimit + 1];
-    size_t size = 0;
-    while (size < sizeof buffer) {
-        const ssize_t n = ::read(fd.get(), buffer + size, sizeof buffer - size);
-        if (n == 0) break;
-        if (n > 0) size += static_cast<size_t>(n);
-        else if (errno != EINTR) return Unreadable(Reason(errno));
-    }
-    if (size > kProgressFileLimit) return Unreadable("plik jest za duży");
-    return {ProgressRead::Status::Read, std::string(buffer, size), {}};
-}
+ui::FileRead ReadProgressFile(const std::filesystem::path& file) { return ui::ReadRegularFile(file, kProgressFileLimit); }
 
 std::string ReplaceProgressFile(const std::filesystem::path& file, const std::string& text)
 {
@@ -122,7 +72,7 @@ std::string ReplaceProgressFile(const std::filesystem::path& file, const std::st
     }
     if (fd < 0) return Reason(EEXIST);
 
-    Descriptor out{fd};
+    ui::Descriptor out{fd};
     int error = WriteAll(out.get(), text);
     // On the disk before the rename, so a power cut can never expose an empty or partial file.
     if (error == 0 && ::fsync(out.get()) != 0) error = errno;

@@ -3,20 +3,15 @@
 #include <filesystem>
 #include <string>
 
+#include "ui/regular_file.h"
+
 namespace kr {
 
 // The progress file holds eight short numbers: anything longer is not ours.
 inline constexpr size_t kProgressFileLimit = 4096;
 
-struct ProgressRead {
-    enum class Status { Read, Missing, Unreadable };
-    Status status = Status::Missing;
-    std::string text;    // the file's bytes, when read
-    std::string reason;  // why it could not be read
-};
-
 // Reads a regular file (or a link to one) of at most kProgressFileLimit bytes, never blocking on open.
-ProgressRead ReadProgressFile(const std::filesystem::path& file);
+ui::FileRead ReadProgressFile(const std::filesystem::path& file);
 
 // Writes `text` to a new file of a fresh name beside `file`, forces it to the disk and renames it over `file`.
 // Returns the system's reason on failure, an empty string on success; `file` is untouched on failure.

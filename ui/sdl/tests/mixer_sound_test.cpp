@@ -78,7 +78,7 @@ TEST_F(MixerSoundTest, LoadsOnlyRegularFilesBesideTheProgram)
 
     std::string problem;
     EXPECT_TRUE(LoadSound(game / "dzwieki" / "uzyj.wav", problem).empty());
-    EXPECT_EQ(problem, "not a regular file");
+    EXPECT_EQ(problem, "to nie jest zwykły plik");
     problem.clear();
     const std::vector<float> bum = LoadSound(game / "dzwieki" / "bum.wav", problem);
     EXPECT_EQ(problem, "");

@@ -61,8 +61,8 @@ TEST(Pictures, OnlyRegularFilesAreDrawnAndAnythingElseIsReportedOnceLikeAMissing
         EXPECT_NE(RasterisePicture(assets, {ui::PictureSet::Object, 0}, 1), nullptr) << "a link to a picture is drawn";
         EXPECT_EQ(RasterisePicture(assets, {ui::PictureSet::Object, 1}, 1), nullptr);
     });
-    const std::string refused = "Kruszarka: cannot draw " + planted.Picture("hero").string() + ": not a regular file\n" +
-                                "Kruszarka: cannot draw " + planted.Picture("icon").string() + ": not a regular file\n";
+    const std::string refused = "Kruszarka: cannot draw " + planted.Picture("hero").string() + ": to nie jest zwykły plik\n" +
+                                "Kruszarka: cannot draw " + planted.Picture("icon").string() + ": to nie jest zwykły plik\n";
     EXPECT_EQ(first.substr(0, refused.size()), refused);
     EXPECT_EQ(first.substr(refused.size()).rfind("Kruszarka: cannot draw " + planted.Picture("object-1").string() + ": ", 0), 0u)
         << first;
