@@ -1,4 +1,4 @@
-#include "ui/sdl/frame_signature.h"
+#include "ui/sdl/control_signature.h"
 
 #include <cstring>
 #include <string_view>
@@ -40,21 +40,28 @@ public:
         Add(picture.set);
         Add(picture.index);
     }
+    void Add(PixelRect rect)
+    {
+        Add(rect.x);
+        Add(rect.y);
+        Add(rect.w);
+        Add(rect.h);
+    }
     uint64_t Value() const { return value_; }
 
 private:
     uint64_t value_ = 0xcbf29ce484222325ull;
 };
 
-void AddTree(Hash& hash, const ui::Control& control)
+}  // namespace
+
+uint64_t ControlSignature(const ui::Control& control, const Placement& placement)
 {
-    if (!control.visible) return;
-    // The control's identity, so that showing one control and hiding another never cancel out.
-    hash.Add(&control);
-    hash.Add(control.left);
-    hash.Add(control.top);
-    hash.Add(control.width);
-    hash.Add(control.height);
+    Hash hash;
+    hash.Add(control.kind);
+    hash.Add(placement.rect);
+    hash.Add(placement.own);
+    hash.Add(placement.ancestors);
     hash.Add(control.enabled);
     switch (control.kind) {
     case ui::ControlKind::Panel:
@@ -87,17 +94,6 @@ void AddTree(Hash& hash, const ui::Control& control)
         hash.Add(control.fill);
         break;
     }
-    hash.Add(control.children.size());
-    for (const ui::Control* child : control.children) AddTree(hash, *child);
-}
-
-}  // namespace
-
-uint64_t FrameSignature(const ui::Form& form)
-{
-    Hash hash;
-    for (const ui::Control* root : form.Roots()) AddTree(hash, *root);
-    hash.Add(form.pointer);
     return hash.Value();
 }
 
