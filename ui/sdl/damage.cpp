@@ -1,6 +1,6 @@
 #include "ui/sdl/damage.h"
 
-#include "ui/sdl/control_signature.h"
+#include "ui/sdl/drawn_state.h"
 
 namespace kr::sdl {
 namespace {
@@ -37,6 +37,12 @@ void AddRect(std::vector<PixelRect>& rects, PixelRect rect, size_t most)
 std::vector<PixelRect> Damage::Collect(const ui::Form& form, FormRenderer& renderer)
 {
     Walk walk{renderer, {}, 0};
+    // Controls are only ever added; a new one anywhere starts the record afresh.
+    if (form.All().size() != controls_) {
+        controls_ = form.All().size();
+        drawn_.clear();
+        whole_ = true;
+    }
     for (const ui::Control* root : form.Roots()) Visit(walk, *root, nullptr, true);
     drawn_.resize(walk.next);
     if (whole_) {
@@ -48,32 +54,33 @@ std::vector<PixelRect> Damage::Collect(const ui::Form& form, FormRenderer& rende
 
 void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown)
 {
-    if (walk.next == drawn_.size()) drawn_.emplace_back();
-    Drawn& drawn = drawn_[walk.next++];
-    // The same controls in the same order as last time, or the window is drawn anew.
-    if (drawn.control != &control) {
-        drawn = {&control, false, 0, {}};
-        whole_ = true;
-    }
+    const size_t index = walk.next++;
+    if (index == drawn_.size()) drawn_.emplace_back();
+    Drawn& drawn = drawn_[index];
     shown = shown && control.visible;
-    if (!shown) {
-        if (drawn.shown) {
-            AddRect(walk.damaged, drawn.extent, kMostRects);
-            drawn.shown = false;
-        }
-        for (const ui::Control* child : control.children) Visit(walk, *child, nullptr, false);
+    if (drawn.control == &control && !shown && !drawn.shown) {
+        // Hidden now and last time: so was everything inside it, as nothing shows through a hidden parent.
+        walk.next = index + drawn.subtree;
         return;
     }
-    const Placement at = Place(control, parent);
-    const uint64_t signature = ControlSignature(control, at);
-    if (!drawn.shown || drawn.signature != signature) {
-        AddRect(walk.damaged, drawn.shown ? drawn.extent : PixelRect{}, kMostRects);
-        drawn.shown = true;
-        drawn.signature = signature;
-        drawn.extent = walk.renderer.Extent(control, at);
-        AddRect(walk.damaged, drawn.extent, kMostRects);
+    if (drawn.control != &control) drawn = {&control, 1, false, {}, {}};
+    if (!shown) {
+        if (drawn.shown) AddRect(walk.damaged, drawn.extent, kMostRects);
+        drawn.shown = false;
+        for (const ui::Control* child : control.children) Visit(walk, *child, nullptr, false);
+    } else {
+        const Placement at = Place(control, parent);
+        if (!drawn.shown || !drawn.state.Matches(control, at)) {
+            AddRect(walk.damaged, drawn.shown ? drawn.extent : PixelRect{}, kMostRects);
+            drawn.shown = true;
+            drawn.state = DrawnState(control, at);
+            drawn.extent = walk.renderer.Extent(control, at);
+            AddRect(walk.damaged, drawn.extent, kMostRects);
+        }
+        for (const ui::Control* child : control.children) Visit(walk, *child, &at, true);
     }
-    for (const ui::Control* child : control.children) Visit(walk, *child, &at, true);
+    // drawn_ may have grown: the reference above is no longer safe.
+    drawn_[index].subtree = walk.next - index;
 }
 
 }  // namespace kr::sdl

@@ -3,6 +3,7 @@
 #include <vector>
 
 #include "ui/form.h"
+#include "ui/sdl/drawn_state.h"
 #include "ui/sdl/form_renderer.h"
 
 namespace kr::sdl {
@@ -21,8 +22,9 @@ public:
 private:
     struct Drawn {
         const ui::Control* control = nullptr;
+        size_t subtree = 1;  // entries of the control and everything inside it
         bool shown = false;
-        uint64_t signature = 0;
+        DrawnState state;
         PixelRect extent;
     };
     struct Walk {
@@ -35,6 +37,7 @@ private:
     void Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown);
 
     std::vector<Drawn> drawn_;  // in drawing order
+    size_t controls_ = 0;
     bool whole_ = true;
 };
 
