@@ -41,10 +41,12 @@ std::vector<PixelRect> Damage::Collect(const ui::Form& form, FormRenderer& rende
     if (form.All().size() != controls_) {
         controls_ = form.All().size();
         drawn_.clear();
+        extents_.clear();
         whole_ = true;
     }
     for (const ui::Control* root : form.Roots()) Visit(walk, *root, nullptr, true);
     drawn_.resize(walk.next);
+    extents_.resize(walk.next);
     if (whole_) {
         whole_ = false;
         return {kWindowPixels};
@@ -55,7 +57,10 @@ std::vector<PixelRect> Damage::Collect(const ui::Form& form, FormRenderer& rende
 void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown)
 {
     const size_t index = walk.next++;
-    if (index == drawn_.size()) drawn_.emplace_back();
+    if (index == drawn_.size()) {
+        drawn_.emplace_back();
+        extents_.emplace_back();
+    }
     Drawn& drawn = drawn_[index];
     shown = shown && control.visible;
     if (drawn.control == &control && !shown && !drawn.shown) {
@@ -65,22 +70,35 @@ void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* pare
     }
     if (drawn.control != &control) drawn = {&control, 1, false, {}, {}};
     if (!shown) {
-        if (drawn.shown) AddRect(walk.damaged, drawn.extent, kMostRects);
+        AddRect(walk.damaged, extents_[index], kMostRects);
+        extents_[index] = {};
         drawn.shown = false;
         for (const ui::Control* child : control.children) Visit(walk, *child, nullptr, false);
     } else {
         const Placement at = Place(control, parent);
         if (!drawn.shown || !drawn.state.Matches(control, at)) {
-            AddRect(walk.damaged, drawn.shown ? drawn.extent : PixelRect{}, kMostRects);
+            AddRect(walk.damaged, extents_[index], kMostRects);
             drawn.shown = true;
             drawn.state = DrawnState(control, at);
-            drawn.extent = walk.renderer.Extent(control, at);
-            AddRect(walk.damaged, drawn.extent, kMostRects);
+            extents_[index] = walk.renderer.Extent(control, at);
+            AddRect(walk.damaged, extents_[index], kMostRects);
         }
+        drawn.at = at;
         for (const ui::Control* child : control.children) Visit(walk, *child, &at, true);
     }
     // drawn_ may have grown: the reference above is no longer safe.
     drawn_[index].subtree = walk.next - index;
 }
 
+void Damage::Draw(FormRenderer& renderer, std::span<const PixelRect> areas) const
+{
+    for (const PixelRect& area : areas) {
+        renderer.BeginArea(area);
+        for (size_t i = 0; i < extents_.size(); ++i)
+            if (!Intersect(extents_[i], area).Empty()) renderer.DrawControl(*drawn_[i].control, drawn_[i].at);
+    }
+    renderer.EndFrame();
+}
+
 }  // namespace kr::sdl
+

@@ -1,5 +1,6 @@
 #pragma once
 #include <cstdint>
+#include <span>
 #include <vector>
 
 #include "ui/form.h"
@@ -18,14 +19,17 @@ public:
     std::vector<PixelRect> Collect(const ui::Form& form, FormRenderer& renderer);
     // The window's pixels are lost: the next Collect returns all of it.
     void Invalidate() { whole_ = true; }
+    // Draws the areas as a full draw of the form at the last Collect would, visiting only the controls that
+    // paint inside them.
+    void Draw(FormRenderer& renderer, std::span<const PixelRect> areas) const;
 
 private:
     struct Drawn {
         const ui::Control* control = nullptr;
         size_t subtree = 1;  // entries of the control and everything inside it
         bool shown = false;
+        Placement at;
         DrawnState state;
-        PixelRect extent;
     };
     struct Walk {
         FormRenderer& renderer;
@@ -37,6 +41,8 @@ private:
     void Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown);
 
     std::vector<Drawn> drawn_;  // in drawing order
+    // What each of them painted (empty when hidden), kept apart so a search of them stays small in memory.
+    std::vector<PixelRect> extents_;
     size_t controls_ = 0;
     bool whole_ = true;
 };

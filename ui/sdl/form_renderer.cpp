@@ -91,32 +91,36 @@ bool FormRenderer::Clip(PixelRect rect)
 
 void FormRenderer::Draw(const ui::Form& form)
 {
-    const PixelRect whole[1] = {kWindowPixels};
-    Draw(form, whole);
+    BeginArea(kWindowPixels);
+    for (const ui::Control* root : form.Roots()) DrawTree(*root, nullptr);
+    EndFrame();
 }
 
-void FormRenderer::Draw(const ui::Form& form, std::span<const PixelRect> areas)
-{
-    for (const PixelRect& area : areas) DrawArea(form, area);
-    SDL_RenderSetClipRect(renderer_, nullptr);
-    area_ = kWindowPixels;
-    text_.EndFrame();
-}
-
-void FormRenderer::DrawArea(const ui::Form& form, PixelRect area)
+void FormRenderer::BeginArea(PixelRect area)
 {
     area_ = Intersect(area, kWindowPixels);
     // Filled rather than cleared: a clear ignores the clip.
-    if (!Clip(area_)) return;
-    FillRect(renderer_, area_, kWindowColour);
-    for (const ui::Control* root : form.Roots()) DrawTree(*root, nullptr);
+    if (Clip(area_)) FillRect(renderer_, area_, kWindowColour);
+}
+
+void FormRenderer::EndFrame()
+{
+    SDL_RenderSetClipRect(renderer_, nullptr);
+    area_ = kWindowPixels;
+    text_.EndFrame();
 }
 
 void FormRenderer::DrawTree(const ui::Control& control, const Placement* parent)
 {
     if (!control.visible) return;
     const Placement at = Place(control, parent);
-    // Nothing of this control or its children can reach the area being drawn.
+    DrawControl(control, at);
+    for (const ui::Control* child : control.children) DrawTree(*child, &at);
+}
+
+void FormRenderer::DrawControl(const ui::Control& control, const Placement& at)
+{
+    // Text may run past its own control, never past the panels holding it.
     if (Intersect(at.ancestors, area_).Empty()) return;
     switch (control.kind) {
     case ui::ControlKind::Label:
@@ -133,7 +137,6 @@ void FormRenderer::DrawTree(const ui::Control& control, const Placement* parent)
         else if (control.kind == ui::ControlKind::Shape) DrawShape(control, at.rect);
         break;
     }
-    for (const ui::Control* child : control.children) DrawTree(*child, &at);
 }
 
 std::optional<FormRenderer::TextBox> FormRenderer::CaptionBox(const ui::Control& control, PixelRect rect)

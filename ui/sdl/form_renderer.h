@@ -1,7 +1,6 @@
 #pragma once
 #include <cstdint>
 #include <optional>
-#include <span>
 
 #include "ui/form.h"
 #include "ui/sdl/assets.h"
@@ -47,8 +46,14 @@ public:
 
     // Clears to the window colour and draws every shown control, later siblings on top; does not present.
     void Draw(const ui::Form& form);
-    // Draws only inside the areas, each cleared first, leaving exactly the pixels a full draw leaves there.
-    void Draw(const ui::Form& form, std::span<const PixelRect> areas);
+
+    // Drawing part of the window: BeginArea clears one area to the window colour and clips everything after it
+    // there; DrawControl then draws a shown control's own face (not its children) placed there, and the
+    // controls drawn in their drawing order leave exactly the pixels a full draw leaves in the area. EndFrame
+    // closes the frame (it does not present).
+    void BeginArea(PixelRect area);
+    void DrawControl(const ui::Control& control, const Placement& at);
+    void EndFrame();
 
     // Every pixel the control itself paints (not its children), for a shown control placed there.
     PixelRect Extent(const ui::Control& control, const Placement& placement);
@@ -69,7 +74,6 @@ private:
     static std::optional<TextBox> CaptionBox(const ui::Control& control, PixelRect rect);
     PixelRect CaptionExtent(const ui::Control& control, const TextBox& where);
 
-    void DrawArea(const ui::Form& form, PixelRect area);
     void DrawTree(const ui::Control& control, const Placement* parent);
     void DrawPicture(const ui::Control& control, PixelRect rect);
     void DrawLabel(const ui::Control& control, const Placement& at);

@@ -151,7 +151,7 @@ bool GameWindow::Redraw()
     }
     const std::vector<PixelRect> damaged = damage_.Collect(game_.form, *form_);
     if (damaged.empty()) return false;
-    form_->Draw(game_.form, damaged);
+    damage_.Draw(*form_, damaged);
     Present(damaged);
     ++framesPresented_;
     return true;
