@@ -68,7 +68,7 @@ void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* pare
         walk.next = index + drawn.subtree;
         return;
     }
-    if (drawn.control != &control) drawn = {&control, 1, false, {}, {}};
+    if (drawn.control != &control) drawn = {&control, 1, false, {}};
     if (!shown) {
         AddRect(walk.damaged, extents_[index], kMostRects);
         extents_[index] = {};
@@ -83,7 +83,6 @@ void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* pare
             extents_[index] = walk.renderer.Extent(control, at);
             AddRect(walk.damaged, extents_[index], kMostRects);
         }
-        drawn.at = at;
         for (const ui::Control* child : control.children) Visit(walk, *child, &at, true);
     }
     // drawn_ may have grown: the reference above is no longer safe.
@@ -95,7 +94,7 @@ void Damage::Draw(FormRenderer& renderer, std::span<const PixelRect> areas) cons
     for (const PixelRect& area : areas) {
         renderer.BeginArea(area);
         for (size_t i = 0; i < extents_.size(); ++i)
-            if (!Intersect(extents_[i], area).Empty()) renderer.DrawControl(*drawn_[i].control, drawn_[i].at);
+            if (!Intersect(extents_[i], area).Empty()) renderer.DrawControl(*drawn_[i].control, drawn_[i].state.At());
     }
     renderer.EndFrame();
 }

@@ -28,7 +28,6 @@ private:
         const ui::Control* control = nullptr;
         size_t subtree = 1;  // entries of the control and everything inside it
         bool shown = false;
-        Placement at;
         DrawnState state;
     };
     struct Walk {

@@ -8,21 +8,20 @@ bool Same(PixelRect a, PixelRect b) { return a.x == b.x && a.y == b.y && a.w == 
 }  // namespace
 
 DrawnState::DrawnState(const ui::Control& control, const Placement& at)
-    : rect_(at.rect), own_(at.own), ancestors_(at.ancestors), look_(LookOf(control)), caption_(control.caption)
+    : at_(at), look_(LookOf(control)), caption_(control.caption)
 {
 }
 
 bool DrawnState::Matches(const ui::Control& control, const Placement& at) const
 {
-    return Same(rect_, at.rect) && Same(own_, at.own) && Same(ancestors_, at.ancestors) &&
+    return Same(at_.rect, at.rect) && Same(at_.own, at.own) && Same(at_.ancestors, at.ancestors) &&
            look_ == LookOf(control) && caption_ == control.caption;
 }
 
 DrawnState::Look DrawnState::LookOf(const ui::Control& c)
 {
-    return {c.kind,        c.enabled,    c.picture,  c.value,    c.back,          c.fore,
-            c.border,      c.fill,       c.transparent, c.bordered, c.wordWrap,   c.outlined,
-            c.filled,      c.font.face,  c.font.bold, c.font.points, c.align,     c.shape,
+    return {c.kind, c.enabled, c.picture, c.value, c.back, c.fore, c.border, c.fill, c.transparent, c.bordered,
+            c.wordWrap, c.outlined, c.filled, c.font.face, c.font.bold, c.font.points, c.align, c.shape,
             c.borderWidth};
 }
 

@@ -14,6 +14,8 @@ public:
     DrawnState(const ui::Control& control, const Placement& at);
 
     bool Matches(const ui::Control& control, const Placement& at) const;
+    // Where it was drawn.
+    const Placement& At() const { return at_; }
 
 private:
     struct Look {
@@ -33,7 +35,7 @@ private:
     };
     static Look LookOf(const ui::Control& control);
 
-    PixelRect rect_, own_, ancestors_;
+    Placement at_;
     Look look_;
     std::string caption_;
 };
