@@ -202,6 +202,13 @@ TEST(GameWindowDamage, DrawsOnlyWhatChangedAndShowsWhatAFullDrawShows)
         game.ui.HealthLabel->caption = "7";
         EXPECT_LT(s.Frame(), 576u * 447u / 20) << "a label changing";
         s.ExpectSameAsFullDraw("a label changing");
+        // A caption far wider than its label runs on over the hero panel; its shorter successor must clear that.
+        game.ui.HealthLabel->caption = "1234567890";
+        s.Frame();
+        s.ExpectSameAsFullDraw("a caption running past its label");
+        game.ui.HealthLabel->caption = "7";
+        s.Frame();
+        s.ExpectSameAsFullDraw("a short caption again");
         ui::Control& panel = *game.ui.GoalPanel[kTerminalPanel];
         panel.visible = false;
         s.Frame();
