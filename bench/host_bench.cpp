@@ -1,8 +1,10 @@
 // kruszarka-bench: what the SDL host costs a player. Prints start-up to the first presented frame, CPU over an
 // idle spell on the main menu and on the board with the real loop (the sound device closed), how soon a sound
-// starts after a silence, the time to draw one full frame at 1x and 2x, and peak memory.
+// starts after a silence, CPU while the board fills at 1x and 2x with the real loop, the time to draw one full
+// frame at 1x and 2x, how far the bomb clock strays from the wall clock over a whole bomb (1,500 ticks of
+// 100 ms with the real loop and clock), and peak memory.
 //
-//   kruszarka-bench [--idle-seconds N] [--frames N]
+//   kruszarka-bench [--idle-seconds N] [--frames N] [--fills N] [--bomb-ticks N]
 //
 // With no DISPLAY it runs on SDL's offscreen driver, which has no way to sleep in SDL_WaitEventTimeout and polls
 // every millisecond instead: run it under X (Xvfb will do) for the idle figure a player sees.
@@ -12,19 +14,25 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cmath>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
+#include <functional>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
+#include "board/fill.h"
+#include "combat/stage.h"
 #include "shell/game.h"
 #include "shell/startup.h"
+#include "shell/timer_numbers.h"
 #include "ui/headless.h"
 #include "ui/sdl/assets.h"
-#include "ui/sdl/frame_signature.h"
+#include "ui/sdl/damage.h"
 #include "ui/sdl/game_window.h"
 #include "ui/sdl/handles.h"
 #include "ui/sdl/mixer_sound.h"
@@ -58,6 +66,8 @@ double PeakMegabytes()
 struct Options {
     double idleSeconds = 10;
     int frames = 200;
+    int fills = 5;
+    int bombTicks = 1500;
 };
 
 Options Parse(int argc, char** argv)
@@ -66,8 +76,12 @@ Options Parse(int argc, char** argv)
     for (int i = 1; i + 1 < argc; i += 2) {
         if (std::strcmp(argv[i], "--idle-seconds") == 0) options.idleSeconds = std::atof(argv[i + 1]);
         else if (std::strcmp(argv[i], "--frames") == 0) options.frames = std::max(1, std::atoi(argv[i + 1]));
+        else if (std::strcmp(argv[i], "--fills") == 0) options.fills = std::max(1, std::atoi(argv[i + 1]));
+        else if (std::strcmp(argv[i], "--bomb-ticks") == 0)
+            options.bombTicks = std::clamp(std::atoi(argv[i + 1]), 2, 1500);
         else {
-            std::fprintf(stderr, "usage: kruszarka-bench [--idle-seconds N] [--frames N]\n");
+            std::fprintf(stderr, "usage: kruszarka-bench [--idle-seconds N] [--frames N] [--fills N] "
+                                 "[--bomb-ticks N]\n");
             std::exit(2);
         }
     }
@@ -185,6 +199,105 @@ void StartUpAndIdle(const Options& options)
     PrintIdle("on the board", cpu, wall, window.FramesPresented() - frames, sound);
 }
 
+void PushQuitNow()
+{
+    SDL_Event quit{};
+    quit.type = SDL_QUIT;
+    SDL_PushEvent(&quit);
+}
+
+// Runs `then` after every tick of one timer, keeping the game's own handler.
+void AfterEachTick(Game& game, int timer, std::function<void()> then)
+{
+    std::function<void()>& onTick = game.timers[timer].onTick;
+    onTick = [own = onTick, then = std::move(then)] {
+        own();
+        then();
+    };
+}
+
+// The whole board fill (64 ticks of 30 ms) in a mission with the real loop on the real clock, several times over.
+void FillCpu(const Options& options, int scale)
+{
+    const sdl::Subsystem video(SDL_INIT_VIDEO | SDL_INIT_TIMER);
+    const sdl::Assets assets = sdl::Assets::BesideExecutable();
+    ui::RecordedSound silent;
+    BenchGame bench(silent);
+    Game& game = bench.game;
+    sdl::GameWindow window(game, assets, scale);
+    StartUp(game, 7);
+    window.Show();
+    window.Redraw();
+    bench.Click("Gra");
+    bench.Click("Misja 1");
+    window.Redraw();
+    AfterEachTick(game, kFillTimer, [&game] {
+        if (!game.timers[kFillTimer].Enabled()) PushQuitNow();
+    });
+
+    double cpu = 0, wall = 0;
+    const uint64_t frames = window.FramesPresented();
+    for (int fill = 0; fill < options.fills; ++fill) {
+        const double cpuBefore = CpuMilliseconds();
+        const Clock::time_point start = Clock::now();
+        if (fill == 0) bench.Click("Rozpocznij misję ->");
+        else StartBoardFill(game);
+        window.Run();
+        wall += MillisecondsSince(start);
+        cpu += CpuMilliseconds() - cpuBefore;
+    }
+    const uint64_t drawn = window.FramesPresented() - frames;
+    std::printf("board fill, real loop %dx     %.1f ms CPU over %.2f s of %d fills (%.2f %% of a core), "
+                "%llu frames, %.3f ms CPU a frame\n",
+                scale, cpu, wall / 1000.0, options.fills, 100.0 * cpu / wall, static_cast<unsigned long long>(drawn),
+                cpu / static_cast<double>(std::max<uint64_t>(drawn, 1)));
+}
+
+// A whole bomb (mission 3's last stage) with the real loop and clock: each tick's wall-clock moment against the
+// first tick's plus whole intervals.
+void BombClock(const Options& options)
+{
+    const sdl::Subsystem video(SDL_INIT_VIDEO | SDL_INIT_TIMER);
+    const sdl::Assets assets = sdl::Assets::BesideExecutable();
+    ui::RecordedSound silent;
+    BenchGame bench(silent);
+    Game& game = bench.game;
+    sdl::GameWindow window(game, assets, sdl::ChooseScale());
+    StartUp(game, 7);
+    window.Show();
+    bench.Click("Gra");
+    bench.Click("Misja 1");
+    bench.Click("Rozpocznij misję ->");
+    // Missions count from 0 inside the game: this is "Misja 3", whose last stage is a bomb of 1,500 ticks.
+    game.ChosenMission = 2;
+    game.MissionStage = 2;
+    SetUpStage(game, 2, 2);
+    if (!game.BombPresent) throw std::runtime_error("mission 3, stage 3 has no bomb");
+
+    std::vector<double> moments;
+    moments.reserve(static_cast<size_t>(options.bombTicks));
+    AfterEachTick(game, kBombClock, [&] {
+        moments.push_back(MillisecondsSince(Clock::time_point{}));
+        if (static_cast<int>(moments.size()) == options.bombTicks) PushQuitNow();
+    });
+    const double cpuBefore = CpuMilliseconds();
+    const Clock::time_point start = Clock::now();
+    window.Run();
+    const double wall = MillisecondsSince(start);
+    const double cpu = CpuMilliseconds() - cpuBefore;
+
+    if (moments.empty()) throw std::runtime_error("the bomb clock never ticked");
+    double worst = 0;
+    for (size_t n = 0; n < moments.size(); ++n) {
+        const double error = moments[n] - moments[0] - static_cast<double>(n) * kNormalBombInterval;
+        if (std::abs(error) > std::abs(worst)) worst = error;
+    }
+    const double last = moments.back() - moments[0] - static_cast<double>(moments.size() - 1) * kNormalBombInterval;
+    std::printf("bomb clock, real loop %dx     %zu ticks: last tick %+.2f ms off the wall clock, worst %+.2f ms; "
+                "%.1f ms CPU over %.1f s (%.2f %%)\n",
+                window.Scale(), moments.size(), last, worst, cpu, wall / 1000.0, 100.0 * cpu / wall);
+}
+
 void FrameTimes(const ui::Form& form, const char* scene, int scale, int frames)
 {
     const sdl::Assets assets = sdl::Assets::BesideExecutable();
@@ -200,13 +313,16 @@ void FrameTimes(const ui::Form& form, const char* scene, int scale, int frames)
         times.push_back(MillisecondsSince(t));
     }
     std::sort(times.begin(), times.end());
-    const Clock::time_point signatureStart = Clock::now();
-    uint64_t sink = 0;
-    for (int i = 0; i < frames; ++i) sink += sdl::FrameSignature(form);
-    const double signature = MillisecondsSince(signatureStart) * 1000.0 / frames;
-    std::printf("frame %-12s %dx         median %.3f ms, worst %.3f ms; first %.1f ms (rasterising); "
-                "signature %.1f us%s\n",
-                scene, scale, times[times.size() / 2], times.back(), cold, signature, sink == 1 ? " " : "");
+    // What every wake-up of the loop costs when nothing changed: comparing each control with its last drawing.
+    sdl::Damage damage;
+    damage.Collect(form, camera.Renderer());
+    const Clock::time_point checkStart = Clock::now();
+    size_t sink = 0;
+    for (int i = 0; i < frames; ++i) sink += damage.Collect(form, camera.Renderer()).size();
+    const double check = MillisecondsSince(checkStart) * 1000.0 / frames;
+    std::printf("frame %-12s %dx         full draw median %.3f ms, worst %.3f ms; first %.1f ms (rasterising); "
+                "damage check %.1f us%s\n",
+                scene, scale, times[times.size() / 2], times.back(), cold, check, sink == 1 ? " " : "");
 }
 
 void RenderTimes(const Options& options)
@@ -235,7 +351,9 @@ int main(int argc, char** argv)
     if (!std::getenv("DISPLAY") && !std::getenv("SDL_VIDEODRIVER")) setenv("SDL_VIDEODRIVER", "offscreen", 1);
     try {
         StartUpAndIdle(options);
+        for (int scale : {1, 2}) FillCpu(options, scale);
         RenderTimes(options);
+        BombClock(options);
     } catch (const std::exception& error) {
         std::fprintf(stderr, "kruszarka-bench: %s\n", error.what());
         return 1;

@@ -3,7 +3,6 @@
 #include <vector>
 
 #include "ui/sdl/caption_box.h"
-#include "ui/sdl/form_renderer.h"
 
 namespace kr::sdl {
 namespace {
@@ -17,20 +16,15 @@ bool Dark(ui::Colour c) { return 299 * c.r + 587 * c.g + 114 * c.b < 128 * 1000;
 
 }  // namespace
 
-void DrawFocusRing(SDL_Renderer* renderer, const ui::Form& form)
+void DrawFocusRing(SDL_Renderer* renderer, const ui::Control& control, PixelRect outer)
 {
-    const ui::Control* focus = form.Focused();
-    if (!focus) return;
-    const PixelRect outer = ToPixels(form.Bounds(*focus));
     PixelRect ring{outer.x + kButtonInset, outer.y + kButtonInset, outer.w - 2 * kButtonInset,
                    outer.h - 2 * kButtonInset};
-    if (focus->kind == ui::ControlKind::CheckBox) {
-        const int left = CaptionBox(*focus, outer).box.x - kCaptionLead;
+    if (control.kind == ui::ControlKind::CheckBox) {
+        const int left = CaptionBox(control, outer).box.x - kCaptionLead;
         ring = {left, outer.y + 1, outer.x + outer.w - 1 - left, outer.h - 2};
     }
     if (ring.Empty()) return;
-    const SDL_Rect clip = ToPixels(form.VisibleBounds(*focus)).Sdl();
-    SDL_RenderSetClipRect(renderer, &clip);
     const int right = ring.x + ring.w - 1, bottom = ring.y + ring.h - 1;
     // Every other pixel round the ring, counted from its top-left corner so the corners line up.
     std::vector<SDL_Rect> dots;
@@ -42,10 +36,9 @@ void DrawFocusRing(SDL_Renderer* renderer, const ui::Form& form)
         dots.push_back({ring.x, y, 1, 1});
         dots.push_back({right, y, 1, 1});
     }
-    const uint8_t ink = Dark(focus->back) ? 255 : 0;
+    const uint8_t ink = Dark(control.back) ? 255 : 0;
     SDL_SetRenderDrawColor(renderer, ink, ink, ink, 255);
     SDL_RenderFillRects(renderer, dots.data(), static_cast<int>(dots.size()));
-    SDL_RenderSetClipRect(renderer, nullptr);
 }
 
 }  // namespace kr::sdl

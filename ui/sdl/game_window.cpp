@@ -5,7 +5,6 @@
 #include <cstdlib>
 #include <stdexcept>
 
-#include "ui/sdl/frame_signature.h"
 #include "ui/sdl/input.h"
 #include "ui/sdl/pictures.h"
 
@@ -64,7 +63,7 @@ GameWindow::~GameWindow() = default;
 void GameWindow::Show()
 {
     SDL_ShowWindow(window_.get());
-    shownSignature_.reset();
+    damage_.Invalidate();
 }
 
 GameWindow::Clock GameWindow::RealClock()
@@ -101,14 +100,18 @@ void GameWindow::Run(const Clock& clock)
             timeout = timeout < 0 ? wait : std::min(timeout, wait);
         }
         SDL_Event event;
-        if (SDL_WaitEventTimeout(&event, timeout)) {
+        const bool woken = SDL_WaitEventTimeout(&event, timeout) != 0;
+        if (woken) {
             do {
                 if (!Handle(event)) return;
             } while (SDL_PollEvent(&event));
         }
+        const uint64_t ticksBefore = game_.timers.TicksRun();
         Tick(clock());
         if (game_.quitRequested) return;
-        Redraw();
+        // SDL counts the wait in whole milliseconds and may return a fraction early: such a wake-up ran no tick
+        // and brought no event, so it changed nothing worth comparing.
+        if (woken || game_.timers.TicksRun() != ticksBefore) Redraw();
     }
 }
 
@@ -150,8 +153,8 @@ bool GameWindow::Handle(const SDL_Event& event)
     case SDL_WINDOWEVENT:
         // The window's pixels were lost or resized: the next Redraw must draw even an unchanged frame.
         if (event.window.event == SDL_WINDOWEVENT_EXPOSED || event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED ||
-            event.window.event == SDL_WINDOWEVENT_RESTORED)
-            shownSignature_.reset();
+            event.window.event == SDL_WINDOWEVENT_RESTORED || event.window.event == SDL_WINDOWEVENT_SHOWN)
+            damage_.Invalidate();
         break;
     default:
         break;
@@ -166,13 +169,26 @@ bool GameWindow::Redraw()
         title_ = game_.form.caption;
         SDL_SetWindowTitle(window_.get(), title_.c_str());
     }
-    const uint64_t signature = FrameSignature(game_.form);
-    if (shownSignature_ == signature) return false;
-    form_->Draw(game_.form);
-    SDL_RenderPresent(renderer_.get());
-    shownSignature_ = signature;
+    const std::vector<PixelRect> damaged = damage_.Collect(game_.form, *form_);
+    if (damaged.empty()) return false;
+    damage_.Draw(*form_, damaged);
+    Present(damaged);
     ++framesPresented_;
     return true;
+}
+
+void GameWindow::Present(const std::vector<PixelRect>& areas)
+{
+    // The software renderer draws straight into the window's surface, so flushing its queue and sending only
+    // the redrawn rectangles presents the frame without copying the untouched rest of the window again.
+    SDL_RenderFlush(renderer_.get());
+    std::vector<SDL_Rect> device;
+    for (const PixelRect& area : areas) {
+        device.push_back({area.x * scale_, area.y * scale_, area.w * scale_, area.h * scale_});
+        pixelsPresented_ += static_cast<uint64_t>(area.w) * static_cast<uint64_t>(area.h);
+    }
+    if (SDL_UpdateWindowSurfaceRects(window_.get(), device.data(), static_cast<int>(device.size())) != 0)
+        SDL_RenderPresent(renderer_.get());
 }
 
 }  // namespace kr::sdl

@@ -3,11 +3,13 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <vector>
 
 #include "shell/game.h"
 #include "tools/record.h"
 #include "ui/sdl/assets.h"
 #include "ui/sdl/cursors.h"
+#include "ui/sdl/damage.h"
 #include "ui/sdl/form_renderer.h"
 #include "ui/sdl/handles.h"
 
@@ -43,13 +45,16 @@ public:
     // Runs the timers up to the moment `clockMs` (the loop's clock); the first call ties that clock to the
     // game's present time.
     void Tick(double clockMs);
-    // Draws and presents when the frame's signature changed (or the window was exposed); true if it did.
+    // Draws and sends to the screen only what changed since the last frame (all of it after the window was
+    // shown, exposed, restored or resized); true if anything was.
     bool Redraw();
 
     // From now on every input reaches the game through `recorder`, which writes it down; nullptr stops that.
     void Record(record::Recorder* recorder) { recorder_ = recorder; }
 
     uint64_t FramesPresented() const { return framesPresented_; }
+    // Window pixels sent to the screen so far, counted at 1x.
+    uint64_t PixelsPresented() const { return pixelsPresented_; }
     uint64_t Rasterised() const { return form_->Rasterised(); }
 
     static Clock RealClock();
@@ -63,6 +68,7 @@ public:
 private:
     void Mouse(record::InputKind kind, int x, int y);
     void Deliver(const record::Input& input);
+    void Present(const std::vector<PixelRect>& areas);
     // The game's time at this clock reading, less what the game did not see.
     double GameTime(double clockMs);
 
@@ -72,8 +78,9 @@ private:
     RendererPtr renderer_;
     std::unique_ptr<FormRenderer> form_;
     PointerCursors cursors_;
-    std::optional<uint64_t> shownSignature_;
+    Damage damage_;
     uint64_t framesPresented_ = 0;
+    uint64_t pixelsPresented_ = 0;
     std::optional<double> offset_;  // game time minus clock time
     std::string title_;
     Chore chore_;

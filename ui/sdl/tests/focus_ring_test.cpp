@@ -2,7 +2,7 @@
 
 #include "shell/game.h"
 #include "ui/sdl/form_renderer.h"
-#include "ui/sdl/frame_signature.h"
+#include "ui/sdl/damage.h"
 #include "ui/sdl/screenshot.h"
 #include "ui/sdl/tests/offscreen.h"
 
@@ -37,10 +37,13 @@ TEST(FocusRing, DottedInsideTheFocusedButtonAtBothScales)
         const SDL_Surface& before = camera.Capture(form);
         EXPECT_EQ(CountPixels(before, ringRow(play), Black), 0) << "no ring before a key asks for the focus";
 
-        const uint64_t unfocused = FrameSignature(form);
+        Damage damage;
+        damage.Collect(form, camera.Renderer());
         form.KeyDown(kTab);
         ASSERT_EQ(form.Focused(), session.game->screen.PlayButton);
-        EXPECT_NE(FrameSignature(form), unfocused);
+        const std::vector<PixelRect> damaged = damage.Collect(form, camera.Renderer());
+        ASSERT_EQ(damaged.size(), 1u) << "the ring alone is worth a new frame";
+        EXPECT_EQ(Intersect(damaged[0], play).w, play.w);
         const SDL_Surface& shot = camera.Capture(form);
         const int dots = (play.w - 4 + 1) / 2;
         EXPECT_EQ(CountPixels(shot, ringRow(play), Black), dots * scale * scale);

@@ -1,7 +1,7 @@
 #include <gtest/gtest.h>
 
 #include "shell/game.h"
-#include "ui/sdl/frame_signature.h"
+#include "ui/sdl/damage.h"
 #include "ui/sdl/screenshot.h"
 #include "ui/sdl/tests/offscreen.h"
 
@@ -58,8 +58,15 @@ TEST(FormRenderer, MainMenuThenMissionMenu)
     EXPECT_NE(PixelAt(shot, options.x - 100, options.y - 20), kButtonGrey) << "the main menu is gone";
 }
 
-// An unchanged screen is neither redrawn nor rasterised again; what is hidden does not count.
-TEST(FormRenderer, RedrawsAndRasterisesOnlyWhatChanged)
+bool Inside(PixelRect inner, PixelRect outer)
+{
+    const PixelRect common = Intersect(inner, outer);
+    return !inner.Empty() && common.w == inner.w && common.h == inner.h;
+}
+
+// An unchanged screen damages nothing and rasterises nothing again; what is hidden does not count; a changed
+// control damages where it was and where it is, and nothing far from it.
+TEST(FormRenderer, DamagesAndRasterisesOnlyWhatChanged)
 {
     HeadlessGame session;
     Game& game = *session.game;
@@ -70,29 +77,70 @@ TEST(FormRenderer, RedrawsAndRasterisesOnlyWhatChanged)
     camera.Capture(game.form);
     EXPECT_EQ(camera.Renderer().Rasterised(), rasterised);
 
-    const uint64_t signature = FrameSignature(game.form);
-    EXPECT_EQ(FrameSignature(game.form), signature);
+    Damage damage;
+    const auto collect = [&] { return damage.Collect(game.form, camera.Renderer()); };
+    const std::vector<PixelRect> first = collect();
+    ASSERT_EQ(first.size(), 1u);
+    EXPECT_TRUE(Inside(kWindowPixels, first[0])) << "the first frame is all new";
+    EXPECT_TRUE(collect().empty());
     game.screen.StageDoneLabel->caption = "ukryty";
     game.screen.StageDoneLabel->top += 15;
-    EXPECT_EQ(FrameSignature(game.form), signature) << "a hidden label changed";
+    EXPECT_TRUE(collect().empty()) << "a hidden label changed";
 
+    // The label sits over the board, under the menu layer: shown, then swapped for another notice.
     game.screen.StageDoneLabel->visible = true;
-    const uint64_t shown = FrameSignature(game.form);
-    EXPECT_NE(shown, signature);
+    const std::vector<PixelRect> shown = collect();
+    ASSERT_EQ(shown.size(), 1u);
+    EXPECT_TRUE(Inside(shown[0], ToPixels(game.form.Bounds(*game.screen.StageDoneLabel)))) << "only its own text";
     game.screen.StageDoneLabel->visible = false;
     game.screen.ReturnPrompt->visible = true;
-    EXPECT_NE(FrameSignature(game.form), shown) << "showing one control is not showing another";
+    const std::vector<PixelRect> swapped = collect();
+    PixelRect both;
+    for (const PixelRect& r : swapped) both = Union(both, r);
+    EXPECT_TRUE(Inside(shown[0], both)) << "the hidden label's pixels are drawn over";
     game.screen.ReturnPrompt->visible = false;
-    ASSERT_EQ(FrameSignature(game.form), signature);
+    collect();
 
+    // A pointer is no part of the frame.
     game.form.pointer = ui::CursorPicture(ui::EnemyTurnCursor);
-    EXPECT_NE(FrameSignature(game.form), signature);
-    game.form.pointer = ui::CursorPicture(ui::NormalCursor);
+    EXPECT_TRUE(collect().empty());
 
-    game.screen.HealthLabel->caption = "123";
-    EXPECT_NE(FrameSignature(game.form), signature);
+    // Moving the menu layer's panel one pixel damages its old and new place, nothing else.
+    const PixelRect before = ToPixels(game.form.Bounds(*game.screen.MainMenuScreen));
+    game.screen.MainMenuScreen->left += 15;
+    const std::vector<PixelRect> moved = collect();
+    ASSERT_EQ(moved.size(), 1u);
+    EXPECT_EQ(moved[0].x, before.x);
+    EXPECT_EQ(moved[0].w, before.w + 1);
+    EXPECT_EQ(moved[0].h, before.h);
+
+    // Measuring a new caption for its damage rasterises it once, for the drawing as well.
     camera.Capture(game.form);
-    EXPECT_EQ(camera.Renderer().Rasterised(), rasterised + 1) << "one new line of text, nothing else";
+    const uint64_t beforeHealth = camera.Renderer().Rasterised();
+    game.screen.HealthLabel->caption = "123";
+    collect();
+    camera.Capture(game.form);
+    EXPECT_EQ(camera.Renderer().Rasterised(), beforeHealth + 1) << "one new line of text, nothing else";
+}
+
+// Touching rectangles merge; separate ones stay apart until there are too many.
+TEST(FormRenderer, DamageRectanglesMerge)
+{
+    std::vector<PixelRect> rects;
+    AddRect(rects, {0, 0, 10, 10}, 3);
+    AddRect(rects, {20, 0, 10, 10}, 3);
+    AddRect(rects, {}, 3);
+    EXPECT_EQ(rects.size(), 2u);
+    AddRect(rects, {10, 5, 10, 2}, 3);
+    ASSERT_EQ(rects.size(), 1u) << "a bridge joins both";
+    EXPECT_EQ(rects[0].x, 0);
+    EXPECT_EQ(rects[0].w, 30);
+    AddRect(rects, {100, 100, 1, 1}, 3);
+    AddRect(rects, {200, 100, 1, 1}, 3);
+    AddRect(rects, {300, 100, 1, 1}, 3);
+    ASSERT_EQ(rects.size(), 1u) << "past three, one box holds all";
+    EXPECT_EQ(rects[0].w, 301);
+    EXPECT_EQ(rects[0].h, 101);
 }
 
 // Hand-made controls with known pixels: outlines lie inside their bounds, circles fill theirs, a long line of

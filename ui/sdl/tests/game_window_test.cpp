@@ -1,7 +1,10 @@
 #include <gtest/gtest.h>
 
+#include "combat/stage.h"
 #include "shell/game.h"
+#include "shell/timer_numbers.h"
 #include "ui/sdl/game_window.h"
+#include "ui/sdl/screenshot.h"
 #include "ui/sdl/tests/offscreen.h"
 
 namespace kr::sdl {
@@ -9,6 +12,7 @@ namespace {
 
 using testing::HeadlessGame;
 using testing::OffscreenVideo;
+using testing::PixelAt;
 using testing::SourceAssets;
 
 SDL_Event MouseButton(Uint32 type, SDL_Point at)
@@ -125,6 +129,138 @@ TEST_F(GameWindowTest, TabShiftTabAndReturn)
     window.Handle(Key(SDLK_RETURN));
     EXPECT_TRUE(game.screen.MissionMenuScreen->visible);
     EXPECT_EQ(game.form.Focused(), game.screen.MissionButtons[0]);
+}
+
+// A press and release in the middle of a control, the way the player clicks a board cell.
+void Press(ui::Form& form, const ui::Control& control)
+{
+    const ui::Rect r = form.Bounds(control);
+    form.MouseDown(r.left + r.width / 2, r.top + r.height / 2);
+    form.MouseUp(r.left + r.width / 2, r.top + r.height / 2);
+}
+
+// The window, drawn piece by piece as things changed, shows exactly what one full draw of the same state shows.
+class PieceByPiece {
+public:
+    explicit PieceByPiece(int scale) : scale_(scale), window(game, SourceAssets(), scale), camera(SourceAssets(), scale) {}
+
+    // One frame of real time; the pixels it sent, at 1x.
+    uint64_t Frame(double milliseconds = 0)
+    {
+        clock_ += milliseconds;
+        window.Tick(clock_);
+        const uint64_t before = window.PixelsPresented();
+        window.Redraw();
+        return window.PixelsPresented() - before;
+    }
+
+    void ExpectSameAsFullDraw(const std::string& when)
+    {
+        const SDL_Surface& full = camera.Capture(game.form);
+        const SDL_Surface* shown = SDL_GetWindowSurface(window.Handle());
+        ASSERT_NE(shown, nullptr);
+        ASSERT_EQ(shown->w, full.w);
+        ASSERT_EQ(shown->h, full.h);
+        int differing = 0;
+        SDL_Point first{-1, -1};
+        for (int y = 0; y < full.h; ++y)
+            for (int x = 0; x < full.w; ++x)
+                if (!(PixelAt(*shown, x, y) == PixelAt(full, x, y)) && differing++ == 0) first = {x, y};
+        EXPECT_EQ(differing, 0) << when << " at " << scale_ << "x: first at " << first.x << ", " << first.y;
+    }
+
+    OffscreenVideo video;
+    HeadlessGame session;
+    Game& game = *session.game;
+
+private:
+    int scale_;
+    double clock_ = 0;
+
+public:
+    GameWindow window;
+    ScreenshotCamera camera;
+};
+
+TEST(GameWindowDamage, DrawsOnlyWhatChangedAndShowsWhatAFullDrawShows)
+{
+    constexpr uint64_t kCell = 33 * 33;
+    for (int scale : {1, 2}) {
+        PieceByPiece s(scale);
+        Game& game = s.game;
+        EXPECT_EQ(s.Frame(), 576u * 447u);
+        s.ExpectSameAsFullDraw("main menu");
+        s.session.Click("Gra");
+        s.session.Click("Misja 1");
+        s.session.Click("Rozpocznij misję ->");
+        s.Frame();
+        s.ExpectSameAsFullDraw("start of the mission");
+
+        // The fill changes one cell a tick and sends no more than that.
+        int frames = 0;
+        while (game.timers[kFillTimer].Enabled()) {
+            EXPECT_LE(s.Frame(30), kCell) << "fill frame " << frames;
+            if (++frames % 20 == 0) s.ExpectSameAsFullDraw("fill frame " + std::to_string(frames));
+        }
+        s.ExpectSameAsFullDraw("the filled board");
+
+        // A swap, then whatever follows it: runs blowing up and falling, or the swap back and its penalty.
+        Press(game.form, *game.screen.Cells[44]);
+        Press(game.form, *game.screen.Cells[45]);
+        for (frames = 0; frames < 200 && !game.InputReady; ++frames) {
+            s.Frame(15);
+            if (frames % 7 == 0) s.ExpectSameAsFullDraw("swap frame " + std::to_string(frames));
+        }
+        EXPECT_TRUE(game.InputReady);
+        s.Frame();
+        s.ExpectSameAsFullDraw("after the swap");
+
+        ui::Control& bar = *game.screen.TerminalWorkBar;
+        ASSERT_TRUE(game.form.Shown(bar));
+        bar.width = bar.width * 2 / 3;
+        EXPECT_LT(s.Frame(), 576u * 447u / 20) << "a bar shrinking";
+        s.ExpectSameAsFullDraw("a bar shrinking");
+        game.screen.HealthLabel->caption = "7";
+        EXPECT_LT(s.Frame(), 576u * 447u / 20) << "a label changing";
+        s.ExpectSameAsFullDraw("a label changing");
+        // A caption far wider than its label runs on over the hero panel; its shorter successor must clear that.
+        game.screen.HealthLabel->caption = "1234567890";
+        s.Frame();
+        s.ExpectSameAsFullDraw("a caption running past its label");
+        game.screen.HealthLabel->caption = "7";
+        s.Frame();
+        s.ExpectSameAsFullDraw("a short caption again");
+        ui::Control& panel = *game.screen.GoalPanel[kTerminalPanel];
+        panel.visible = false;
+        s.Frame();
+        s.ExpectSameAsFullDraw("a panel hidden");
+        panel.visible = true;
+        s.Frame();
+        s.ExpectSameAsFullDraw("the panel shown again");
+        game.form.KeyDown(27);
+        s.Frame();
+        s.ExpectSameAsFullDraw("the return prompt");
+        game.form.KeyDown(84);
+        s.Frame();
+        s.ExpectSameAsFullDraw("back on the main menu");
+        game.form.KeyDown(9);
+        game.form.KeyDown(9);
+        s.Frame();
+        s.ExpectSameAsFullDraw("the keyboard focus moved");
+        game.form.MouseMove(0, 0);
+        game.form.MouseDown(0, 0);
+        game.form.MouseUp(0, 0);
+        s.Frame();
+        s.ExpectSameAsFullDraw("the focus gone");
+
+        // Nothing changed, nothing sent; the window's pixels lost, all of them sent.
+        EXPECT_EQ(s.Frame(), 0u);
+        SDL_Event exposed{};
+        exposed.type = SDL_WINDOWEVENT;
+        exposed.window.event = SDL_WINDOWEVENT_EXPOSED;
+        s.window.Handle(exposed);
+        EXPECT_EQ(s.Frame(), 576u * 447u);
+    }
 }
 
 // A stall (a modal box, a suspended machine) resumes the game where it stopped instead of replaying it.
