@@ -2,12 +2,12 @@
 
 #include <exception>
 #include <string>
-#include <system_error>
 
 #include "shell/texts.h"
 #include "ui/picture.h"
 #include "ui/sdl/fonts.h"
 #include "ui/sdl/pictures.h"
+#include "ui/sdl/sound_file.h"
 
 namespace kr::sdl {
 namespace {
@@ -27,17 +27,10 @@ int MissingSounds(const Assets& assets, std::ostream& report)
 {
     int missing = 0;
     for (const char* name : kSoundFiles) {
-        const std::filesystem::path file = assets.Resolve(name);
-        std::error_code error;
-        SDL_AudioSpec spec{};
-        Uint8* samples = nullptr;
-        Uint32 length = 0;
-        // Only a regular file is opened: a pipe under a sound's name would hold the check forever.
-        if (std::filesystem::is_regular_file(file, error) && SDL_LoadWAV(file.c_str(), &spec, &samples, &length)) {
-            SDL_FreeWAV(samples);
-            continue;
-        }
-        report << "missing sound: " << name << '\n';
+        // Through the game's own loader, so what passes here is what the game will play.
+        std::string problem;
+        if (!LoadSound(assets.Resolve(name), problem).empty()) continue;
+        report << "missing sound: " << name << (problem.empty() ? "" : ": " + problem) << '\n';
         ++missing;
     }
     return missing;
@@ -47,7 +40,7 @@ int MissingFonts(int scale, std::ostream& report)
 {
     int missing = 0;
     Fonts fonts(scale);
-    for (const ui::Face face : {ui::Face::Mono, ui::Face::Sans})
+    for (const ui::Face face : {ui::Face::Mono, ui::Face::Sans, ui::Face::Narrow})
         for (const bool bold : {false, true}) {
             try {
                 fonts.Get(ui::Font{face, bold, 9.0f});
