@@ -6,7 +6,7 @@
 //
 //   kruszarka-bench [--idle-seconds N] [--frames N] [--fills N] [--bomb-ticks N] [--only fill]
 //
-// --only fill measures just the board fill at 2x, for a profiler or an instruction count.
+// --only fill measures just the board fills at 2x (started at once and after the briefing), for a profiler.
 //
 // With no DISPLAY it runs on SDL's offscreen driver, which has no way to sleep in SDL_WaitEventTimeout and polls
 // every millisecond instead: run it under X (Xvfb will do) for the idle figure a player sees.
@@ -357,7 +357,7 @@ int main(int argc, char** argv)
     if (!std::getenv("DISPLAY") && !std::getenv("SDL_VIDEODRIVER")) setenv("SDL_VIDEODRIVER", "offscreen", 1);
     try {
         if (options.onlyFill) {
-            FillCpu(options, 2, false);
+            for (bool briefingRead : {false, true}) FillCpu(options, 2, briefingRead);
             return 0;
         }
         StartUpAndIdle(options);
