@@ -4,7 +4,9 @@
 // frame at 1x and 2x, how far the bomb clock strays from the wall clock over a whole bomb (1,500 ticks of
 // 100 ms with the real loop and clock), and peak memory.
 //
-//   kruszarka-bench [--idle-seconds N] [--frames N] [--fills N] [--bomb-ticks N]
+//   kruszarka-bench [--idle-seconds N] [--frames N] [--fills N] [--bomb-ticks N] [--only fill]
+//
+// --only fill measures just the board fills at 2x (started at once and after the briefing), for a profiler.
 //
 // With no DISPLAY it runs on SDL's offscreen driver, which has no way to sleep in SDL_WaitEventTimeout and polls
 // every millisecond instead: run it under X (Xvfb will do) for the idle figure a player sees.
@@ -68,6 +70,7 @@ struct Options {
     int frames = 200;
     int fills = 5;
     int bombTicks = 1500;
+    bool onlyFill = false;
 };
 
 Options Parse(int argc, char** argv)
@@ -79,9 +82,10 @@ Options Parse(int argc, char** argv)
         else if (std::strcmp(argv[i], "--fills") == 0) options.fills = std::max(1, std::atoi(argv[i + 1]));
         else if (std::strcmp(argv[i], "--bomb-ticks") == 0)
             options.bombTicks = std::clamp(std::atoi(argv[i + 1]), 2, 1500);
+        else if (std::strcmp(argv[i], "--only") == 0 && std::strcmp(argv[i + 1], "fill") == 0) options.onlyFill = true;
         else {
             std::fprintf(stderr, "usage: kruszarka-bench [--idle-seconds N] [--frames N] [--fills N] "
-                                 "[--bomb-ticks N]\n");
+                                 "[--bomb-ticks N] [--only fill]\n");
             std::exit(2);
         }
     }
@@ -217,7 +221,8 @@ void AfterEachTick(Game& game, int timer, std::function<void()> then)
 }
 
 // The whole board fill (64 ticks of 30 ms) in a mission with the real loop on the real clock, several times over.
-void FillCpu(const Options& options, int scale)
+// A player who starts at once fills the board while the hidden briefing still types; one who read it does not.
+void FillCpu(const Options& options, int scale, bool briefingRead)
 {
     const sdl::Subsystem video(SDL_INIT_VIDEO | SDL_INIT_TIMER);
     const sdl::Assets assets = sdl::Assets::BesideExecutable();
@@ -230,6 +235,7 @@ void FillCpu(const Options& options, int scale)
     window.Redraw();
     bench.Click("Gra");
     bench.Click("Misja 1");
+    while (briefingRead && game.timers[kTypewriterTimer].Enabled()) game.timers.Advance(1000);
     window.Redraw();
     AfterEachTick(game, kFillTimer, [&game] {
         if (!game.timers[kFillTimer].Enabled()) PushQuitNow();
@@ -247,9 +253,9 @@ void FillCpu(const Options& options, int scale)
         cpu += CpuMilliseconds() - cpuBefore;
     }
     const uint64_t drawn = window.FramesPresented() - frames;
-    std::printf("board fill, real loop %dx     %.1f ms CPU over %.2f s of %d fills (%.2f %% of a core), "
+    std::printf("board fill, real loop %dx%s %.1f ms CPU over %.2f s of %d fills (%.2f %% of a core), "
                 "%llu frames, %.3f ms CPU a frame\n",
-                scale, cpu, wall / 1000.0, options.fills, 100.0 * cpu / wall, static_cast<unsigned long long>(drawn),
+                scale, briefingRead ? ", read" : "     ", cpu, wall / 1000.0, options.fills, 100.0 * cpu / wall, static_cast<unsigned long long>(drawn),
                 cpu / static_cast<double>(std::max<uint64_t>(drawn, 1)));
 }
 
@@ -350,8 +356,13 @@ int main(int argc, char** argv)
     const Options options = Parse(argc, argv);
     if (!std::getenv("DISPLAY") && !std::getenv("SDL_VIDEODRIVER")) setenv("SDL_VIDEODRIVER", "offscreen", 1);
     try {
+        if (options.onlyFill) {
+            for (bool briefingRead : {false, true}) FillCpu(options, 2, briefingRead);
+            return 0;
+        }
         StartUpAndIdle(options);
-        for (int scale : {1, 2}) FillCpu(options, scale);
+        for (int scale : {1, 2}) FillCpu(options, scale, false);
+        FillCpu(options, 2, true);
         RenderTimes(options);
         BombClock(options);
     } catch (const std::exception& error) {

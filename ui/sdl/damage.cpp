@@ -44,7 +44,7 @@ std::vector<PixelRect> Damage::Collect(const ui::Form& form, FormRenderer& rende
         extents_.clear();
         whole_ = true;
     }
-    for (const ui::Control* root : form.Roots()) Visit(walk, *root, nullptr, true);
+    for (const ui::Control* root : form.Roots()) Visit(walk, *root, nullptr, true, false);
     drawn_.resize(walk.next);
     extents_.resize(walk.next);
     if (whole_) {
@@ -54,7 +54,7 @@ std::vector<PixelRect> Damage::Collect(const ui::Form& form, FormRenderer& rende
     return std::move(walk.damaged);
 }
 
-void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown)
+void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown, bool parentMoved)
 {
     const size_t index = walk.next++;
     if (index == drawn_.size()) {
@@ -68,14 +68,23 @@ void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* pare
         walk.next = index + drawn.subtree;
         return;
     }
-    if (drawn.control != &control) drawn = {&control, 1, false, {}};
+    if (drawn.control != &control) drawn = {&control, 1, false, {}, {}, {}};
     if (!shown) {
         AddRect(walk.damaged, extents_[index], kMostRects);
         extents_[index] = {};
         drawn.shown = false;
-        for (const ui::Control* child : control.children) Visit(walk, *child, nullptr, false);
+        for (const ui::Control* child : control.children) Visit(walk, *child, nullptr, false, true);
     } else {
-        const Placement at = Place(control, parent);
+        // Placing is a pure function of the bounds and the parent's placement: unchanged inputs, unchanged result.
+        const std::array<float, 4> bounds{control.left, control.top, control.width, control.height};
+        bool moved = parentMoved || !drawn.shown || drawn.bounds != bounds;
+        if (moved) {
+            const Placement placed = Place(control, parent);
+            moved = !drawn.shown || !(placed == drawn.placed);
+            drawn.placed = placed;
+            drawn.bounds = bounds;
+        }
+        const Placement at = drawn.placed;
         const bool focused = &control == walk.focus;
         if (!drawn.shown || !drawn.state.Matches(control, at, focused)) {
             AddRect(walk.damaged, extents_[index], kMostRects);
@@ -84,7 +93,7 @@ void Damage::Visit(Walk& walk, const ui::Control& control, const Placement* pare
             extents_[index] = walk.renderer.Extent(control, at);
             AddRect(walk.damaged, extents_[index], kMostRects);
         }
-        for (const ui::Control* child : control.children) Visit(walk, *child, &at, true);
+        for (const ui::Control* child : control.children) Visit(walk, *child, &at, true, moved);
     }
     // drawn_ may have grown: the reference above is no longer safe.
     drawn_[index].subtree = walk.next - index;

@@ -1,4 +1,5 @@
 #pragma once
+#include <array>
 #include <cstdint>
 #include <span>
 #include <vector>
@@ -29,6 +30,9 @@ private:
         size_t subtree = 1;  // entries of the control and everything inside it
         bool shown = false;
         DrawnState state;
+        // Where the last walk placed it and from which bounds: unmoved under an unmoved parent, it lands there again.
+        std::array<float, 4> bounds{};
+        Placement placed;
     };
     struct Walk {
         FormRenderer& renderer;
@@ -37,8 +41,9 @@ private:
         size_t next;
     };
 
-    // Compares one control and its children, in drawing order, with how they were drawn.
-    void Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown);
+    // Compares one control and its children, in drawing order, with how they were drawn. `parentMoved` is false
+    // when the parent landed exactly where the last walk placed it.
+    void Visit(Walk& walk, const ui::Control& control, const Placement* parent, bool shown, bool parentMoved);
 
     std::vector<Drawn> drawn_;  // in drawing order
     // What each of them painted (empty when hidden), kept apart so a search of them stays small in memory.

@@ -1,12 +1,6 @@
 #include "ui/sdl/drawn_state.h"
 
 namespace kr::sdl {
-namespace {
-
-bool Same(PixelRect a, PixelRect b) { return a.x == b.x && a.y == b.y && a.w == b.w && a.h == b.h; }
-
-}  // namespace
-
 DrawnState::DrawnState(const ui::Control& control, const Placement& at, bool focused)
     : at_(at), focused_(focused), look_(LookOf(control)), caption_(control.caption)
 {
@@ -14,7 +8,7 @@ DrawnState::DrawnState(const ui::Control& control, const Placement& at, bool foc
 
 bool DrawnState::Matches(const ui::Control& control, const Placement& at, bool focused) const
 {
-    return focused_ == focused && Same(at_.rect, at.rect) && Same(at_.own, at.own) && Same(at_.ancestors, at.ancestors) &&
+    return focused_ == focused && at_.rect == at.rect && at_.own == at.own && at_.ancestors == at.ancestors &&
            look_ == LookOf(control) && caption_ == control.caption;
 }
 

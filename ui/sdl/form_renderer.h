@@ -24,6 +24,7 @@ struct Placement {
     PixelRect ancestors;  // what its ancestors leave of the window: text may run past its bounds up to here
     float left = 0, top = 0;                                          // its corner in window twips
     float visibleLeft = 0, visibleTop = 0, visibleRight = 0, visibleBottom = 0;  // `own` in twips
+    friend bool operator==(const Placement&, const Placement&) = default;
 };
 // Worked out from where the parent landed (nullptr for a control placed directly in the window), so a walk
 // down the tree places every control in one step.

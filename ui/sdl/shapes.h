@@ -12,6 +12,7 @@ struct PixelRect {
     int x = 0, y = 0, w = 0, h = 0;
     bool Empty() const { return w <= 0 || h <= 0; }
     SDL_Rect Sdl() const { return {x, y, w, h}; }
+    friend bool operator==(const PixelRect&, const PixelRect&) = default;
 };
 
 void FillRect(SDL_Renderer* renderer, PixelRect rect, ui::Colour colour);

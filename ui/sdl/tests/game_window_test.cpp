@@ -237,6 +237,11 @@ TEST(GameWindowDamage, DrawsOnlyWhatChangedAndShowsWhatAFullDrawShows)
         panel.visible = true;
         s.Frame();
         s.ExpectSameAsFullDraw("the panel shown again");
+        // Only the panel's own bounds change: what it holds must follow.
+        ASSERT_FALSE(panel.children.empty());
+        panel.left += 150;
+        s.Frame();
+        s.ExpectSameAsFullDraw("a panel moved with what it holds");
         game.form.KeyDown(27);
         s.Frame();
         s.ExpectSameAsFullDraw("the return prompt");
