@@ -26,18 +26,6 @@ std::filesystem::path FreshTemporaryName(const std::filesystem::path& file)
     return name;
 }
 
-// Returns errno, or 0 when all was written.
-int WriteAll(int fd, const std::string& text)
-{
-    for (size_t done = 0; done < text.size();) {
-        const ssize_t n = ::write(fd, text.data() + done, text.size() - done);
-        if (n > 0) done += static_cast<size_t>(n);
-        else if (n == 0) return EIO;
-        else if (errno != EINTR) return errno;
-    }
-    return 0;
-}
-
 // Makes the rename itself durable; a folder that cannot be synced still holds the renamed file.
 void SyncFolder(const std::filesystem::path& file)
 {
@@ -73,7 +61,7 @@ std::string ReplaceProgressFile(const std::filesystem::path& file, const std::st
     if (fd < 0) return Reason(EEXIST);
 
     ui::Descriptor out{fd};
-    int error = WriteAll(out.get(), text);
+    int error = ui::WriteAll(out.get(), text);
     // On the disk before the rename, so a power cut can never expose an empty or partial file.
     if (error == 0 && ::fsync(out.get()) != 0) error = errno;
     const int closeError = out.Close();

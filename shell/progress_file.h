@@ -3,7 +3,7 @@
 #include <filesystem>
 #include <string>
 
-#include "ui/regular_file.h"
+#include "ui/file_io.h"
 
 namespace kr {
 

@@ -9,6 +9,7 @@
 
 #include "board/grid.h"
 #include "board/resolve.h"
+#include "hero/skills.h"
 #include "shell/timer_numbers.h"
 #include "tests/fight_helpers.h"
 #include "tests/session.h"
@@ -31,9 +32,6 @@ const std::map<int, int> kPrice[7] = {
     {{0, 1}, {2, 3}, {3, 1}, {4, 1}},  // "Wybuch"
     {{0, 5}, {3, 5}},                  // "Śmiercionośne naboje"
 };
-
-constexpr int kAimedShot = 0, kTeleport = 1, kBulletTime = 2, kGrenade = 3, kHealing = 4, kBlast = 5,
-              kDeadlyBullets = 6;
 
 // Sets every resource counter and lights the panel as a refresh does.
 void GiveResources(Session& s, int each)

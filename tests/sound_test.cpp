@@ -4,32 +4,17 @@
 #include <cmath>
 #include <vector>
 
-#include "board/resolve.h"
 #include "shell/sound.h"
-#include "shell/timer_numbers.h"
+#include "tests/fight_helpers.h"
 #include "tests/session.h"
 
 namespace kr {
 namespace {
 
-using testing::Session;
+using namespace testing;
 
 // Mission 1 open, the sound switch as given, every attribute 0, tutorial off.
 std::string Progress(int soundSwitch) { return " 1 \r\n " + std::to_string(soundSwitch) + " \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n 0 \r\n"; }
-
-// Row 1 reads k k 3 k over a pattern with no run: swapping cells 13 and 14 lines up three icons of kind k.
-// Stops at the moment the run takes effect, before new icons fall and perhaps line up more.
-void PlayRun(Session& s, char kind)
-{
-    s.SetBoard(std::string{kind, kind, '3', kind} +
-               "2302\n23023023\n30230230\n02302302\n23023023\n30230230\n02302302\n55053023\n");
-    ASSERT_TRUE(FindRuns(s.game.Board, s.game.GreenFlag).empty());
-    s.Press(13);
-    s.Press(14);
-    s.Advance(240);
-}
-
-void Settle(Session& s) { s.AdvanceUntil([&] { return s.game.InputReady && NothingRunning(s.game.timers); }); }
 
 // Mission 1 from the menu to the mission-complete screen, with the sound switch on and off.
 TEST(Sound, EachMomentPlaysItsChannelAndOnlyWithTheSwitchOn)
@@ -41,17 +26,17 @@ TEST(Sound, EachMomentPlaysItsChannelAndOnlyWithTheSwitchOn)
         s.StartMission(0);
         EXPECT_EQ(s.Sounds(), expect({10})) << "the stage is set up";
 
-        PlayRun(s, '0');
+        PlayRun(s, "000");
         EXPECT_EQ(s.Sounds(), expect({4})) << "grey bullets reload";
         Settle(s);
         s.Sounds();
-        PlayRun(s, '2');
+        PlayRun(s, "222");
         EXPECT_EQ(s.Sounds(), expect({4})) << "so do grenades";
         Settle(s);
         s.Sounds();
 
         s.Run("set TerminalWork 1");
-        PlayRun(s, '4');
+        PlayRun(s, "444");
         EXPECT_EQ(s.Sounds(), expect({5})) << "the door needs work";
         s.AdvanceUntil([&] { return s.game.screen.StageDoneLabel->visible; });
         EXPECT_EQ(s.Sounds(), expect({7})) << "the door was the stage's goal";
@@ -60,7 +45,7 @@ TEST(Sound, EachMomentPlaysItsChannelAndOnlyWithTheSwitchOn)
 
         Settle(s);
         s.Run("set EnemyHealth 1");
-        PlayRun(s, '1');
+        PlayRun(s, "111");
         const std::vector<int> shot = s.Sounds();
         if (soundSwitch == 1) EXPECT_TRUE(shot == std::vector<int>{0} || shot == std::vector<int>{1});
         else EXPECT_TRUE(shot.empty());

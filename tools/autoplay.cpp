@@ -151,8 +151,9 @@ std::pair<int, double> BestBlastCell(const Game& g)
     return best;
 }
 
-// One helpful skill, if any; true when one was used (and its target pressed).
-bool UseHelpfulSkill(Game& g, MissionResult& result)
+// One helpful skill, if any, measured against the best neighbour swap; true when one was used (and its target
+// pressed).
+bool UseHelpfulSkill(Game& g, const std::optional<SwapChoice>& best, MissionResult& result)
 {
     const int missing = g.MaxHealth - g.Health;
     if (Usable(g, kHealing) && missing >= 12 && (2 * g.Health <= g.MaxHealth || InDanger(g)))
@@ -175,8 +176,7 @@ bool UseHelpfulSkill(Game& g, MissionResult& result)
             return true;
         }
     }
-    if (!Usable(g, kTeleport) && !Usable(g, kBlast)) return false;
-    const double ordinary = BestSwap(g).value_or(SwapChoice{0, 0, 0}).value;
+    const double ordinary = best ? best->value : 0;
     if (Usable(g, kTeleport)) {
         const std::optional<SwapChoice> far = BestTeleport(g);
         if (far && far->value > ordinary * 1.5 + 6 && Use(g, kTeleport, result)) {
@@ -284,8 +284,9 @@ MissionResult PlayMission(Game& g, int mission, int64_t limit)
         if (g.InputReady && !g.screen.MenuLayer->visible) {
             // A selection left over (a board target keeps it) would turn the next press into a deselection.
             if (g.screen.SelectionMarker->visible) PressCell(g, g.SelectedCell);
-            if (UseHelpfulSkill(g, result)) continue;
-            if (const std::optional<SwapChoice> swap = BestSwap(g)) {
+            const std::optional<SwapChoice> swap = BestSwap(g);
+            if (UseHelpfulSkill(g, swap, result)) continue;
+            if (swap) {
                 PressCell(g, swap->from);
                 PressCell(g, swap->to);
                 ++result.moves;

@@ -1,43 +1,34 @@
 #include "tools/record_file.h"
 
 #include <fcntl.h>
-#include <unistd.h>
 
 #include <cerrno>
 #include <cstring>
 #include <iostream>
 #include <memory>
 
+#include "ui/file_io.h"
+
 namespace kr::record {
 namespace {
 
-class Descriptor {
+// The recording as the game goes: each line reaches the system at once, so a crash keeps everything up to it;
+// a failed write is told once and ends the recording.
+class RecordingDescriptor {
 public:
-    Descriptor(int fd, std::filesystem::path file) : fd_(fd), file_(std::move(file)) {}
-    Descriptor(const Descriptor&) = delete;
-    Descriptor& operator=(const Descriptor&) = delete;
-    ~Descriptor()
-    {
-        if (fd_ >= 0) ::close(fd_);
-    }
+    RecordingDescriptor(int fd, std::filesystem::path file) : fd_(fd), file_(std::move(file)) {}
 
     void Write(const std::string& text)
     {
-        for (size_t done = 0; fd_ >= 0 && done < text.size();) {
-            const ssize_t n = ::write(fd_, text.data() + done, text.size() - done);
-            if (n > 0) {
-                done += static_cast<size_t>(n);
-            } else if (n == 0 || errno != EINTR) {
-                std::cerr << "kruszarka: the recording stopped, " << file_.string() << ": "
-                          << (n == 0 ? "nothing written" : std::strerror(errno)) << '\n';
-                ::close(fd_);
-                fd_ = -1;
-            }
+        if (!fd_.valid()) return;
+        if (const int error = ui::WriteAll(fd_.get(), text); error != 0) {
+            std::cerr << "kruszarka: the recording stopped, " << file_.string() << ": " << std::strerror(error) << '\n';
+            fd_ = ui::Descriptor{};
         }
     }
 
 private:
-    int fd_;
+    ui::Descriptor fd_;
     std::filesystem::path file_;
 };
 
@@ -51,7 +42,7 @@ std::optional<Recorder::Sink> RecordingFile(const std::filesystem::path& file, s
         error = file.string() + ": " + (errno == EEXIST ? "already exists, choose a new name" : std::strerror(errno));
         return std::nullopt;
     }
-    auto descriptor = std::make_shared<Descriptor>(fd, file);
+    auto descriptor = std::make_shared<RecordingDescriptor>(fd, file);
     return [descriptor](const std::string& text) { descriptor->Write(text); };
 }
 

@@ -7,6 +7,8 @@
 #include <cerrno>
 #include <cstring>
 
+#include "ui/file_io.h"
+
 namespace kr::ui {
 namespace {
 
@@ -42,15 +44,13 @@ std::string EnterFolder(const std::filesystem::path& folder)
     }
     // The folder is opened without following a link and entered through that same handle, so what was
     // checked is what the game works in.
-    const int handle = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC);
-    if (handle < 0) return Failure(folder, errno);
+    const Descriptor handle{::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC)};
+    if (!handle.valid()) return Failure(folder, errno);
     struct stat status {};
-    std::string why;
-    if (::fstat(handle, &status) != 0) why = Failure(folder, errno);
-    else if (status.st_uid != ::geteuid()) why = folder.string() + ": należy do innego użytkownika";
-    else if (::fchdir(handle) != 0) why = Failure(folder, errno);
-    ::close(handle);
-    return why;
+    if (::fstat(handle.get(), &status) != 0) return Failure(folder, errno);
+    if (status.st_uid != ::geteuid()) return folder.string() + ": należy do innego użytkownika";
+    if (::fchdir(handle.get()) != 0) return Failure(folder, errno);
+    return {};
 }
 
 }  // namespace kr::ui

@@ -5,7 +5,7 @@
 #include <cstring>
 #include <string>
 
-#include "ui/regular_file.h"
+#include "ui/file_io.h"
 
 namespace kr::sdl {
 

@@ -6,7 +6,7 @@
 #include <cstring>
 #include <memory>
 
-#include "ui/regular_file.h"
+#include "ui/file_io.h"
 #include "ui/sdl/voices.h"
 
 namespace kr::sdl {

@@ -1,4 +1,4 @@
-#include "ui/regular_file.h"
+#include "ui/file_io.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -90,6 +90,17 @@ FileRead ReadRegularFile(const std::filesystem::path& file, size_t limit)
     if (size > limit) return {FileRead::Status::Unreadable, {}, "plik jest za duży"};
     bytes.resize(size);
     return {FileRead::Status::Read, std::move(bytes), {}};
+}
+
+int WriteAll(int fd, const std::string& text)
+{
+    for (size_t done = 0; done < text.size();) {
+        const ssize_t n = ::write(fd, text.data() + done, text.size() - done);
+        if (n > 0) done += static_cast<size_t>(n);
+        else if (n == 0) return EIO;
+        else if (errno != EINTR) return errno;
+    }
+    return 0;
 }
 
 }  // namespace kr::ui

@@ -42,4 +42,7 @@ Descriptor OpenRegularFile(const std::filesystem::path& file, std::string& reaso
 // The whole of a regular file of at most `limit` bytes.
 FileRead ReadRegularFile(const std::filesystem::path& file, size_t limit);
 
+// Writes all of `text`, going on after an interrupted or partial write; returns errno, or 0 when all was written.
+int WriteAll(int fd, const std::string& text);
+
 }  // namespace kr::ui
