@@ -21,6 +21,9 @@ size_t CharacterLength(unsigned char lead)
     return 4;
 }
 
+// Typing goes on into the hidden label; no one sees it, so the window need not wake for each letter.
+void TypeOnUnseen(Game& g) { g.timers[kTypewriterTimer].unseen = true; }
+
 }  // namespace
 
 void EnableMissionButtons(Game& g)
@@ -44,6 +47,7 @@ void MissionChosen(Game& g, int16_t mission)
     g.screen.BriefingScreen->visible = true;
     g.screen.BriefingLabel->caption.clear();
     g.timers[kTypewriterTimer].SetEnabled(true);
+    g.timers[kTypewriterTimer].unseen = false;
     g.MissionStage = 0;
     g.ChosenMission = mission;
 }
@@ -62,6 +66,7 @@ void TypewriterTick(Game& g)
 void StartMissionClicked(Game& g)
 {
     g.screen.BriefingScreen->visible = false;
+    TypeOnUnseen(g);
     g.screen.MissionMenuScreen->visible = false;
     PlaceTutorialPanel(g);
     // Nothing paid for in another mission carries into this one: no armed target, no slow time, no deadly
@@ -76,6 +81,7 @@ void StartMissionClicked(Game& g)
 void BriefingBackClicked(Game& g)
 {
     g.screen.BriefingScreen->visible = false;
+    TypeOnUnseen(g);
     g.screen.MissionMenuScreen->visible = true;
 }
 

@@ -98,5 +98,24 @@ TEST(Timers, EnablingSchedulesOneIntervalLaterAndANewIntervalCountsFromTheChange
     EXPECT_FALSE(r.bank.NextDue().has_value());
 }
 
+// A timer no one sees lets the loop sleep past its ticks; they still run in order and at their own moments.
+TEST(Timers, UnseenTicksMayWaitForTheNextWakeUpButKeepTheirMoments)
+{
+    Recorder r;
+    r.Watch(1);
+    r.Watch(5);
+    r.bank[1].SetInterval(30);
+    r.bank[5].SetInterval(10);
+    r.bank[5].SetEnabled(true);
+    EXPECT_EQ(r.bank.NextWake(), 10);
+    r.bank[5].unseen = true;
+    EXPECT_EQ(r.bank.NextDue(), 10);
+    EXPECT_EQ(r.bank.NextWake(), 10 + TimerBank::kUnseenLateness);
+    r.bank[1].SetEnabled(true);
+    EXPECT_EQ(r.bank.NextWake(), 30) << "a seen tick still wakes the loop on time";
+    r.bank.AdvanceTo(30);
+    EXPECT_EQ(r.log, "5@10 5@20 1@30 5@30 ");
+}
+
 }  // namespace
 }  // namespace kr::ui

@@ -49,6 +49,17 @@ std::optional<int64_t> TimerBank::NextDue() const
     return next;
 }
 
+std::optional<int64_t> TimerBank::NextWake() const
+{
+    std::optional<int64_t> next;
+    for (const Timer& timer : timers_) {
+        if (!timer.enabled_ || timer.interval_ <= 0) continue;
+        const int64_t wake = timer.due_ + (timer.unseen ? kUnseenLateness : 0);
+        if (!next || wake < *next) next = wake;
+    }
+    return next;
+}
+
 void TimerBank::AdvanceTo(int64_t moment)
 {
     for (;;) {

@@ -22,6 +22,10 @@ public:
 
     std::string tag;
     std::function<void()> onTick;
+    // Set while the timer's ticks change nothing the player can see (typing into a hidden label): the loop
+    // need not wake for them and runs them, still in order and at their own moments, when it wakes for
+    // something else, at most kUnseenLateness after they fell due.
+    bool unseen = false;
 
 private:
     friend class TimerBank;
@@ -44,8 +48,13 @@ public:
     const Timer& operator[](int number) const;
 
     int64_t Now() const { return now_; }
+    static constexpr int64_t kUnseenLateness = 200;
+
     // The moment of the next tick, if any timer runs.
     std::optional<int64_t> NextDue() const;
+    // The latest moment a loop driving the clock should look at the timers again: the next tick, or a
+    // little after it when no one would see it run.
+    std::optional<int64_t> NextWake() const;
 
     // Runs every tick that falls due up to `moment`, in deadline order (ties: lower timer number first),
     // moving the clock to each tick's moment before its handler runs, so a handler may stop,

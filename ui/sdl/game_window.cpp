@@ -17,8 +17,9 @@ constexpr int kHeight = 447;
 constexpr int kDecoration = 64;
 // 4x already fills a 4K screen.
 constexpr int kLargestScale = 4;
-// The most game time one wake-up may run. Beyond it (a modal box, a suspended laptop) the game resumes
-// where it stopped instead of replaying every missed tick of its animations in one burst.
+// The most game time one wake-up may run past the tick it woke for. Beyond it (a modal box, a suspended
+// laptop) the game resumes where it stopped instead of replaying every missed tick of its animations in one
+// burst.
 constexpr double kLongestCatchUp = 250;
 
 }  // namespace
@@ -78,9 +79,29 @@ double GameWindow::GameTime(double clockMs)
 {
     const double now = static_cast<double>(game_.timers.Now());
     if (!offset_) offset_ = now - clockMs;
-    const double behind = clockMs + *offset_ - now;
-    if (behind > kLongestCatchUp) *offset_ -= behind - kLongestCatchUp;
+    // Counted from the next tick rather than from the last wake-up: a loop that slept until a tick fell due
+    // must run it, however long the sleep.
+    if (const std::optional<int64_t> due = game_.timers.NextDue()) {
+        const double limit = std::max(now, static_cast<double>(*due)) + kLongestCatchUp;
+        const double time = clockMs + *offset_;
+        if (time > limit) *offset_ -= time - limit;
+    }
     return clockMs + *offset_;
+}
+
+int GameWindow::SleepFor(double clockMs)
+{
+    int timeout = -1;
+    if (const std::optional<int64_t> wake = game_.timers.NextWake()) {
+        // Rounded up: waking a fraction early would find nothing due and wait again.
+        const double wait = static_cast<double>(*wake) - GameTime(clockMs);
+        timeout = wait <= 0 ? 0 : static_cast<int>(std::min(std::ceil(wait), 86'400'000.0));
+    }
+    if (const std::optional<double> chore = chore_ ? chore_() : std::nullopt) {
+        const int wait = static_cast<int>(std::clamp(std::ceil(*chore), 0.0, 86'400'000.0));
+        timeout = timeout < 0 ? wait : std::min(timeout, wait);
+    }
+    return timeout;
 }
 
 void GameWindow::Run(const Clock& clock)
@@ -89,19 +110,10 @@ void GameWindow::Run(const Clock& clock)
     GameTime(clock());
     Redraw();
     while (!game_.quitRequested) {
-        int timeout = -1;
-        if (const std::optional<int64_t> due = game_.timers.NextDue()) {
-            // Rounded up: waking a fraction early would find nothing due and wait again.
-            const double wait = static_cast<double>(*due) - GameTime(clock());
-            timeout = wait <= 0 ? 0 : static_cast<int>(std::min(std::ceil(wait), 86'400'000.0));
-        }
-        if (const std::optional<double> chore = chore_ ? chore_() : std::nullopt) {
-            const int wait = static_cast<int>(std::clamp(std::ceil(*chore), 0.0, 86'400'000.0));
-            timeout = timeout < 0 ? wait : std::min(timeout, wait);
-        }
         SDL_Event event;
-        const bool woken = SDL_WaitEventTimeout(&event, timeout) != 0;
+        const bool woken = SDL_WaitEventTimeout(&event, SleepFor(clock())) != 0;
         if (woken) {
+            InputArrives(clock());
             do {
                 if (!Handle(event)) return;
             } while (SDL_PollEvent(&event));
@@ -113,6 +125,13 @@ void GameWindow::Run(const Clock& clock)
         // and brought no event, so it changed nothing worth comparing.
         if (woken || game_.timers.TicksRun() != ticksBefore) Redraw();
     }
+}
+
+void GameWindow::InputArrives(double clockMs)
+{
+    // The ticks that fell due before this moment run first, as they would have had the loop woken for each;
+    // the input then comes a millisecond short of its moment, ahead of the ticks the moment itself makes due.
+    game_.timers.AdvanceTo(static_cast<int64_t>(std::floor(GameTime(clockMs))) - 1);
 }
 
 void GameWindow::Tick(double clockMs)

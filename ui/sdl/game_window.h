@@ -40,7 +40,13 @@ public:
     // Waits for events and timer ticks until the game asks to quit or the window is closed.
     void Run(const Clock& clock = RealClock());
 
-    // The pieces of the loop. Handle returns false when the program must end.
+    // The pieces of the loop. How long it may sleep at this clock reading before a timer or the chore wants
+    // it: whole milliseconds, -1 for as long as no event comes.
+    int SleepFor(double clockMs);
+    // Events woke the loop at this clock reading: the game's clock is brought up to their moment, so they
+    // are handled at the time they came rather than at the time of the last tick.
+    void InputArrives(double clockMs);
+    // Handle returns false when the program must end.
     bool Handle(const SDL_Event& event);
     // Runs the timers up to the moment `clockMs` (the loop's clock); the first call ties that clock to the
     // game's present time.

@@ -1,7 +1,10 @@
 #include <gtest/gtest.h>
 
+#include <utility>
+
 #include "combat/stage.h"
 #include "shell/game.h"
+#include "shell/texts.h"
 #include "shell/timer_numbers.h"
 #include "ui/sdl/game_window.h"
 #include "ui/sdl/screenshot.h"
@@ -275,14 +278,88 @@ TEST_F(GameWindowTest, StallIsNotReplayed)
     ASSERT_TRUE(Click(window, session, "Gra"));
     ASSERT_TRUE(Click(window, session, "Misja 1"));
     ASSERT_TRUE(Click(window, session, "Rozpocznij misję ->"));
-    const int64_t before = game.timers.Now();
+    const int64_t next = *game.timers.NextDue();
     const uint64_t ticksBefore = game.timers.TicksRun();
     clock += 60'000;
     window.Tick(clock);
-    EXPECT_LE(game.timers.Now() - before, 250);
+    EXPECT_EQ(game.timers.Now(), next + 250) << "the next tick and a quarter of a second after it";
     EXPECT_LT(game.timers.TicksRun() - ticksBefore, 50u);
     Pass(100);
-    EXPECT_EQ(game.timers.Now() - before, 350) << "real time runs on from the stall";
+    EXPECT_EQ(game.timers.Now(), next + 350) << "real time runs on from the stall";
+}
+
+// Asleep until the only running timer falls due, however far off, the loop runs that tick when it wakes.
+TEST_F(GameWindowTest, ALoneTimerTicksWhenTheLoopWakesForIt)
+{
+    for (int timer = 1; timer <= ui::TimerBank::kCount; ++timer) game.timers[timer].SetEnabled(false);
+    window.Tick(clock);
+    game.timers[kHintTimer].SetEnabled(true);
+    const std::string hint = game.screen.HintLabel->caption;
+    const int sleep = window.SleepFor(clock);
+    EXPECT_EQ(sleep, 30'000);
+    clock += sleep;
+    window.Tick(clock);
+    EXPECT_EQ(game.timers.Now(), 30'000);
+    EXPECT_EQ(game.timers.TicksRun(), 1u) << "the hint changed on time";
+}
+
+// Clicked after a while on the mission list, the briefing starts typing from its first letter: the loop
+// handles the click at the moment it came, not at the last tick long before.
+TEST_F(GameWindowTest, AnInputAfterAPauseIsHandledAtItsOwnMoment)
+{
+    window.Tick(clock);
+    ASSERT_TRUE(Click(window, session, "Gra"));
+    const SDL_Point mission = session.Centre("Misja 1");
+    SDL_Event down = MouseButton(SDL_MOUSEBUTTONDOWN, mission), up = MouseButton(SDL_MOUSEBUTTONUP, mission);
+    SDL_Event quit{};
+    quit.type = SDL_QUIT;
+    SDL_PushEvent(&down);
+    SDL_PushEvent(&up);
+    SDL_PushEvent(&quit);
+    // The loop reads the clock once as it starts; the click comes five seconds later.
+    bool started = false;
+    window.Run([&started] { return std::exchange(started, true) ? 5'000.0 : 0.0; });
+    ASSERT_TRUE(game.screen.BriefingScreen->visible);
+    clock = 5'000;
+    window.Tick(clock);
+    EXPECT_EQ(game.screen.BriefingLabel->caption, "");
+    Pass(20);
+    EXPECT_EQ(game.screen.BriefingLabel->caption, "To");
+}
+
+// Ticks that fell due before an input run ahead of it, and those of its own moment after it.
+TEST_F(GameWindowTest, AnInputComesAfterTheTicksDueBeforeIt)
+{
+    window.Tick(clock);
+    ASSERT_TRUE(Click(window, session, "Gra"));
+    ASSERT_TRUE(Click(window, session, "Misja 1"));
+    clock += 50;
+    window.InputArrives(clock);
+    EXPECT_EQ(game.timers.Now(), 49);
+    EXPECT_EQ(game.screen.BriefingLabel->caption, "To b") << "the letters due at 10..40";
+    ASSERT_TRUE(Click(window, session, "<- Wróć do menu misji"));
+    EXPECT_EQ(game.timers[kTypewriterTimer].Interval(), 10);
+    window.Tick(clock);
+    EXPECT_EQ(game.screen.BriefingLabel->caption, "To bę") << "the letter due at 50, after the click";
+}
+
+// Once the briefing is left, its typing goes on unseen and wakes the loop only with the board's own ticks,
+// or a few times a second on the mission list.
+TEST_F(GameWindowTest, HiddenTypingDoesNotWakeTheLoop)
+{
+    window.Tick(clock);
+    ASSERT_TRUE(Click(window, session, "Gra"));
+    ASSERT_TRUE(Click(window, session, "Misja 1"));
+    EXPECT_EQ(window.SleepFor(clock), 10) << "typing shows on the briefing";
+    ASSERT_TRUE(Click(window, session, "<- Wróć do menu misji"));
+    EXPECT_EQ(window.SleepFor(clock), 10 + ui::TimerBank::kUnseenLateness);
+    ASSERT_TRUE(Click(window, session, "Misja 1"));
+    EXPECT_EQ(window.SleepFor(clock), 10) << "a new choice types in sight again";
+    ASSERT_TRUE(Click(window, session, "Rozpocznij misję ->"));
+    EXPECT_EQ(window.SleepFor(clock), 30) << "the fill's ticks";
+    Pass(8'000);
+    EXPECT_FALSE(game.timers[kTypewriterTimer].Enabled());
+    EXPECT_EQ(game.screen.BriefingLabel->caption, kBriefings[0]) << "every letter was typed, in order";
 }
 
 // The real loop on the real clock ends on the window's close and on the game's own request.
