@@ -354,7 +354,11 @@ int main(int argc, char** argv)
 {
     SDL_SetMainReady();
     const Options options = Parse(argc, argv);
-    if (!std::getenv("DISPLAY") && !std::getenv("SDL_VIDEODRIVER")) setenv("SDL_VIDEODRIVER", "offscreen", 1);
+    if (!std::getenv("DISPLAY") && !std::getenv("SDL_VIDEODRIVER")) {
+        setenv("SDL_VIDEODRIVER", "offscreen", 1);
+        std::printf("no display: on SDL's offscreen driver, which polls every millisecond, the CPU figures are not a "
+                    "player's (run it under X or Xvfb)\n");
+    }
     try {
         if (options.onlyFill) {
             for (bool briefingRead : {false, true}) FillCpu(options, 2, briefingRead);
