@@ -166,8 +166,12 @@ bool GameWindow::Handle(const SDL_Event& event)
         Mouse(record::InputKind::Move, event.motion.x, event.motion.y);
         break;
     case SDL_KEYDOWN:
-        if (const std::optional<int> code = GameKeyCode(event.key.keysym.sym))
+        if (const std::optional<int> code = GameKeyCode(event.key.keysym.sym)) {
+            // Held down, Enter or Space would go on to press whatever each new screen focuses: only the first
+            // press of a key counts. Tab and the arrows repeat as a held key should.
+            if (event.key.repeat && (*code == ui::Form::kEnterKey || *code == ui::Form::kSpaceKey)) break;
             Deliver({record::InputKind::Key, 0, 0, *code, ShiftHeld(event.key.keysym.mod)});
+        }
         break;
     case SDL_WINDOWEVENT:
         // The window's pixels were lost or resized: the next Redraw must draw even an unchanged frame.

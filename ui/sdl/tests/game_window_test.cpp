@@ -132,6 +132,20 @@ TEST_F(GameWindowTest, TabShiftTabAndReturn)
     window.Handle(Key(SDLK_RETURN));
     EXPECT_TRUE(game.screen.MissionMenuScreen->visible);
     EXPECT_EQ(game.form.Focused(), game.screen.MissionButtons[0]);
+
+    // Enter held down: its repeats do not press on through the mission list; a held arrow moves on.
+    SDL_Event held = Key(SDLK_RETURN);
+    held.key.repeat = 1;
+    window.Handle(held);
+    held.key.keysym.sym = SDLK_SPACE;
+    window.Handle(held);
+    EXPECT_TRUE(game.screen.MissionMenuScreen->visible);
+    EXPECT_FALSE(game.screen.BriefingScreen->visible);
+    held.key.keysym.sym = SDLK_DOWN;
+    window.Handle(held);
+    EXPECT_EQ(game.form.Focused(), game.screen.MissionMenuBack) << "only Misja 1 is open";
+    window.Handle(Key(SDLK_RETURN));
+    EXPECT_TRUE(game.screen.MainMenuScreen->visible) << "a fresh press still presses";
 }
 
 // A press and release in the middle of a control, the way the player clicks a board cell.
