@@ -41,21 +41,13 @@ const Timer& TimerBank::operator[](int number) const
     return timers_[static_cast<size_t>(number - 1)];
 }
 
-std::optional<int64_t> TimerBank::NextDue() const
-{
-    std::optional<int64_t> next;
-    for (const Timer& timer : timers_)
-        if (timer.enabled_ && timer.interval_ > 0 && (!next || timer.due_ < *next)) next = timer.due_;
-    return next;
-}
-
-std::optional<int64_t> TimerBank::NextWake() const
+std::optional<int64_t> TimerBank::Earliest(bool lateness) const
 {
     std::optional<int64_t> next;
     for (const Timer& timer : timers_) {
         if (!timer.enabled_ || timer.interval_ <= 0) continue;
-        const int64_t wake = timer.due_ + (timer.unseen ? kUnseenLateness : 0);
-        if (!next || wake < *next) next = wake;
+        const int64_t moment = timer.due_ + (lateness && timer.unseen ? kUnseenLateness : 0);
+        if (!next || moment < *next) next = moment;
     }
     return next;
 }

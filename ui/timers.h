@@ -51,10 +51,10 @@ public:
     static constexpr int64_t kUnseenLateness = 200;
 
     // The moment of the next tick, if any timer runs.
-    std::optional<int64_t> NextDue() const;
+    std::optional<int64_t> NextDue() const { return Earliest(false); }
     // The latest moment a loop driving the clock should look at the timers again: the next tick, or a
     // little after it when no one would see it run.
-    std::optional<int64_t> NextWake() const;
+    std::optional<int64_t> NextWake() const { return Earliest(true); }
 
     // Runs every tick that falls due up to `moment`, in deadline order (ties: lower timer number first),
     // moving the clock to each tick's moment before its handler runs, so a handler may stop,
@@ -67,6 +67,8 @@ public:
 
 private:
     friend class Timer;
+    // The earliest tick of a running timer, unseen ones put off by their lateness when `lateness` is set.
+    std::optional<int64_t> Earliest(bool lateness) const;
     std::array<Timer, kCount> timers_;
     int64_t now_ = 0;
     uint64_t ticks_ = 0;

@@ -15,7 +15,6 @@ using testing::PixelAt;
 using testing::Rgb;
 using testing::SourceAssets;
 
-constexpr int kTab = 9;
 constexpr Rgb kBlack{0, 0, 0};
 constexpr Rgb kButtonGrey{192, 192, 192};
 
@@ -39,7 +38,7 @@ TEST(FocusRing, DottedInsideTheFocusedButtonAtBothScales)
 
         Damage damage;
         damage.Collect(form, camera.Renderer());
-        form.KeyDown(kTab);
+        form.KeyDown(ui::Form::kTabKey);
         ASSERT_EQ(form.Focused(), session.game->screen.PlayButton);
         const std::vector<PixelRect> damaged = damage.Collect(form, camera.Renderer());
         ASSERT_EQ(damaged.size(), 1u) << "the ring alone is worth a new frame";
@@ -54,7 +53,7 @@ TEST(FocusRing, DottedInsideTheFocusedButtonAtBothScales)
         EXPECT_EQ(PixelAt(shot, (play.x + 1) * scale, (play.y + 1) * scale), kButtonGrey) << "inside the edge";
         EXPECT_EQ(CountPixels(shot, ringRow(options), Black), 0);
 
-        form.KeyDown(kTab);
+        form.KeyDown(ui::Form::kTabKey);
         const SDL_Surface& moved = camera.Capture(form);
         EXPECT_EQ(CountPixels(moved, ringRow(play), Black), 0);
         EXPECT_EQ(CountPixels(moved, ringRow(options), Black), dots * scale * scale);
